@@ -1,0 +1,28 @@
+# The libraries that the foundation stands on. What only tests, benchmarks or fuzz targets use is
+# looked for where they are built.
+
+include_guard(GLOBAL)
+
+find_package(Boost 1.81 REQUIRED)
+if(NOT APPLE)
+  find_package(ICU 72 REQUIRED COMPONENTS uc i18n data)
+endif()
+
+# JAVA_HOME may be unset although a compiler is on the path; its real place then says where.
+macro(qorn_find_java)
+  if(NOT JAVA_HOME AND NOT DEFINED ENV{JAVA_HOME})
+    find_program(QORN_JAVAC javac)
+    mark_as_advanced(QORN_JAVAC)
+    if(QORN_JAVAC)
+      file(REAL_PATH ${QORN_JAVAC} QORN_JAVAC_FILE)
+      cmake_path(GET QORN_JAVAC_FILE PARENT_PATH JAVA_HOME)
+      cmake_path(GET JAVA_HOME PARENT_PATH JAVA_HOME)
+    endif()
+  endif()
+  find_package(JNI REQUIRED COMPONENTS JVM)
+  find_package(Java 11 REQUIRED COMPONENTS Development)
+endmacro()
+
+if(QORN_BUILD_BRIDGE)
+  qorn_find_java()
+endif()

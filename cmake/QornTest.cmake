@@ -1,0 +1,33 @@
+# qorn_add_test(<name> SOURCES ... LIBRARIES ... [WRAP ...] [LABELS ...])
+#
+# A test program of GoogleTest. Each of its tests becomes a CTest test in a process of its own, so
+# that caches and singletons start fresh. WRAP names functions of other units that the program puts
+# its own `__wrap_` versions in front of at link time (Linux).
+
+include_guard(GLOBAL)
+include(GoogleTest)
+find_package(GTest REQUIRED)
+
+function(qorn_add_test name)
+  cmake_parse_arguments(PARSE_ARGV 1 arg "" "" "SOURCES;LIBRARIES;WRAP;LABELS")
+  add_executable(${name} ${arg_SOURCES})
+  if(QORN_SANITIZE)
+    target_sources(${name} PRIVATE ${PROJECT_SOURCE_DIR}/tests/support/SanitizerOptions.cpp)
+  endif()
+  target_link_libraries(${name} PRIVATE
+    qorn_test_support ${arg_LIBRARIES} GTest::gtest_main qorn_build_options)
+  target_compile_definitions(${name} PRIVATE
+    QORN_TEST_DATA="${PROJECT_SOURCE_DIR}/tests/data")
+  foreach(symbol IN LISTS arg_WRAP)
+    target_link_options(${name} PRIVATE LINKER:--wrap=${symbol})
+  endforeach()
+  if(arg_LABELS)
+    set(labels LABELS "${arg_LABELS}")
+  endif()
+  gtest_discover_tests(${name}
+    DISCOVERY_TIMEOUT 120
+    PROPERTIES
+      TIMEOUT 300
+      SKIP_REGULAR_EXPRESSION "\\[  SKIPPED \\]"
+      ${labels})
+endfunction()

@@ -1,0 +1,12 @@
+// Read by the sanitizers' runtimes at start, however the program is started.
+
+extern "C" char const* __asan_default_options();
+extern "C" char const* __ubsan_default_options();
+
+extern "C" char const* __asan_default_options() {
+    return "detect_stack_use_after_return=1:strict_string_checks=1";
+}
+
+extern "C" char const* __ubsan_default_options() {
+    return "print_stacktrace=1:halt_on_error=1";
+}
