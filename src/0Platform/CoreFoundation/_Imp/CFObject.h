@@ -1,0 +1,31 @@
+/// What every object of this platform begins with, and where its memory comes from.
+#ifndef QORN_0PLATFORM_CFOBJECT_H
+#define QORN_0PLATFORM_CFOBJECT_H
+
+#include <CoreFoundation/CFBase.h>
+
+#include <atomic>
+#include <cstddef>
+
+extern "C" {
+/// The only two functions that take and give back an object's memory, in a unit of their own:
+/// tests put counting versions in their place at link time and so see each object that is left.
+void* CFObjectAllocate_(std::size_t bytes);
+void CFObjectFree_(void* object);
+}
+
+namespace CFPlatform {
+
+/// The head of an object. `finalize` frees what the object owns besides its own memory.
+struct Object {
+    using TFinalize = void (*)(Object& object);
+
+    explicit Object(TFinalize finalizer) : references(1), finalize(finalizer) {}
+
+    std::atomic<CFIndex> references;
+    TFinalize finalize;
+};
+
+} // namespace CFPlatform
+
+#endif

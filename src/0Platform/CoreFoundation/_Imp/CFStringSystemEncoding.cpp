@@ -1,0 +1,5 @@
+#include <CoreFoundation/CFString.h>
+
+extern "C" CFStringEncoding CFStringGetSystemEncoding(void) {
+    return kCFStringEncodingMacRoman;
+}
