@@ -1,0 +1,7 @@
+/// Compile-time building blocks, all of them.
+#ifndef QORN_1BASE_TEMPLMETA_H
+#define QORN_1BASE_TEMPLMETA_H
+
+#include "1Base/TemplMeta/TemplMetaTag.h"
+
+#endif
