@@ -1,0 +1,8 @@
+/// Platform strings.
+#ifndef QORN_2SYSTEM_MACOS_H
+#define QORN_2SYSTEM_MACOS_H
+
+#include "2System/MacOS/MacOSCFStringConverter.h"
+#include "2System/MacOS/MacOSTempCFString.h"
+
+#endif
