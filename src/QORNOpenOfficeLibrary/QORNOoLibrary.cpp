@@ -1,4 +1,5 @@
 #include "QORNOpenOfficeLibrary/QORNOoLibrary.h"
+#include "QORNOpenOfficeLibrary/QORNOoLibraryPaths.h"
 
 #include "2System/MacOS/MacOSCFStringConverter.h"
 

@@ -1,12 +1,10 @@
-// The native methods of the Java class veltra_qorn.QORN_OoLibrary: the library's whole outward
-// face. An exception passes through them as it is, and then the platform strings of that call stay
-// unreleased; there is no handler and no clean-up on purpose.
+// From Java strings to platform strings, and nothing more. There is no handler and no clean-up on
+// purpose: an exception passes, and then the platform strings of that call stay unreleased.
 
+#include "QORNOpenOfficeLibrary/QORNOoLibrary_if.h"
 #include "QORNOpenOfficeLibrary/QORNOoLibrary.h"
 
 #include <CoreFoundation/CoreFoundation.h>
-
-#include <jni.h>
 
 namespace {
 
@@ -20,8 +18,6 @@ CFStringRef createString(JNIEnv* env, jstring text) {
 }
 
 } // namespace
-
-extern "C" {
 
 JNIEXPORT jint JNICALL Java_veltra_1qorn_QORN_1OoLibrary_initializeLibrary(
     JNIEnv* env, jobject, jstring folder1, jstring folder2, jstring folder3, jstring folder4,
@@ -50,5 +46,4 @@ JNIEXPORT jint JNICALL Java_veltra_1qorn_QORN_1OoLibrary_startSuppressingDialogs
 
 JNIEXPORT jint JNICALL Java_veltra_1qorn_QORN_1OoLibrary_stopSuppressingDialogs(JNIEnv*, jobject) {
     return 0;
-}
 }
