@@ -1,0 +1,25 @@
+# qorn_add_java(<name> SOURCES ...)
+#
+# The target <name> compiles Java sources into the folder java/<name> of the build, which it owns.
+
+include_guard(GLOBAL)
+
+# In the "C" locale a Java machine loses every path that is not ASCII.
+set(QORN_JAVA_LOCALE LC_ALL=C.UTF-8)
+
+function(qorn_add_java name)
+  cmake_parse_arguments(PARSE_ARGV 1 arg "" "" "SOURCES")
+  list(TRANSFORM arg_SOURCES PREPEND ${CMAKE_CURRENT_SOURCE_DIR}/)
+  set(classes ${PROJECT_BINARY_DIR}/java/${name})
+  set(stamp ${CMAKE_CURRENT_BINARY_DIR}/${name}.stamp)
+  add_custom_command(OUTPUT ${stamp}
+    COMMAND ${CMAKE_COMMAND} -E rm -rf ${classes}
+    COMMAND ${CMAKE_COMMAND} -E make_directory ${classes}
+    COMMAND ${CMAKE_COMMAND} -E env ${QORN_JAVA_LOCALE} ${Java_JAVAC_EXECUTABLE}
+            --release 11 -encoding UTF-8 -Xlint:all -Werror -d ${classes} ${arg_SOURCES}
+    COMMAND ${CMAKE_COMMAND} -E touch ${stamp}
+    DEPENDS ${arg_SOURCES}
+    COMMENT "Compiling Java ${name}"
+    VERBATIM)
+  add_custom_target(${name} ALL DEPENDS ${stamp})
+endfunction()
