@@ -223,9 +223,11 @@ TEST_F(CQORNOoLibraryTest, ATextOfManyPassesComesWhole) {
 using CFakeJavaDeathTest = CQORNOoLibraryTest;
 
 TEST_F(CFakeJavaDeathTest, AnyOtherFunctionOfJavaEndsTheProgram) {
+    // A sanitizer already objects to the type of the function that would say so, and names it.
+    char const* const message = "of the JNI function table|failLoudly";
     jstring const text = java_.makeString(u"/home/ada");
-    EXPECT_DEATH(java_.GetStringUTFChars(text, nullptr), "Entry [0-9]+ of the JNI function table");
-    EXPECT_DEATH(java_.ExceptionCheck(), "Entry [0-9]+ of the JNI function table");
+    EXPECT_DEATH(java_.GetStringUTFChars(text, nullptr), message);
+    EXPECT_DEATH(java_.ExceptionCheck(), message);
 }
 
 } // namespace
