@@ -1,0 +1,108 @@
+/// The one road by which a value of any type becomes text, and text becomes a number.
+///
+///     StdUtil::stream_cast<Strings::string>(42);                      // L"42"
+///     StdUtil::stream_cast<int>(Strings::string(L" 12abc"));          // 12
+///     StdUtil::stream_cast<Strings::string>(std::string("\xC3\xA9")); // L"\u00E9"
+///
+/// A type takes part by having an output operator for the wide stream. A cast is made by the
+/// stream of the default locale, except from one string kind to another, which goes through
+/// Encoding::convert. A `char` array is no such kind: the stream widens its bytes one by one and
+/// decodes nothing, while the same bytes behind a `char const*` are decoded as UTF-8.
+///
+/// A text may go on behind its number: what follows is not looked at. A stream that fails ends in
+/// Detail::throwStreamCastError; an exception of a type's own operator passes.
+///
+/// There is no shared state: casts may run on any thread.
+#ifndef QORN_1BASE_STDUTILSTREAMCAST_H
+#define QORN_1BASE_STDUTILSTREAMCAST_H
+
+#include "1Base/StdUtil/StdUtilStreamCastFailures.h"
+#include "1Base/Streams/StreamsBuffer.h"
+#include "1Base/Streams/StreamsString.h"
+#include "1Base/Strings/StringsKinds.h"
+
+#include <string>
+#include <typeinfo>
+
+namespace StdUtil {
+
+/// One pair of types: a static `cast`. Never made as an object.
+template <class TTarget, class TSource>
+class CStreamCaster;
+
+/// Text from anything that can be written to a stream.
+template <class TChar, class TTraits, class TAllocator, class TSource>
+class CStreamCaster<std::basic_string<TChar, TTraits, TAllocator>, TSource> {
+  public:
+    using TString = std::basic_string<TChar, TTraits, TAllocator>;
+
+    static TString cast(TSource const& source) {
+        Streams::Detail::basic_ostringstream<TChar, TTraits, TAllocator> stream(
+            static_cast<unsigned int>(std::ios_base::out));
+        stream << source;
+        if (stream.fail())
+            Detail::throwStreamCastError(__FILE__, __LINE__, __PRETTY_FUNCTION__, __DATE__,
+                                         __TIME__, typeid(TSource).name(), typeid(TString).name());
+        return stream.str();
+    }
+};
+
+/// A number from text.
+template <class TTarget, class TChar, class TTraits, class TAllocator>
+class CStreamCaster<TTarget, std::basic_string<TChar, TTraits, TAllocator>> {
+  public:
+    using TString = std::basic_string<TChar, TTraits, TAllocator>;
+
+    static TTarget cast(TString const& source) {
+        Streams::basic_isbufstream<TChar, TTraits> stream(source.data(), source.size());
+        TTarget target = 0;
+        stream >> target;
+        if (stream.fail())
+            Detail::throwStreamCastError(__FILE__, __LINE__, __PRETTY_FUNCTION__, __DATE__,
+                                         __TIME__, typeid(TString).name(), typeid(TTarget).name());
+        return target;
+    }
+};
+
+/// Text from text uses no stream. Both schemes above would fit, so each pair stands by itself.
+template <>
+class CStreamCaster<Strings::string, Strings::string> {
+  public:
+    static Strings::string cast(Strings::string const& source) { return source; }
+};
+
+template <>
+class CStreamCaster<Strings::string, std::string> {
+  public:
+    static Strings::string cast(std::string const& source);
+};
+
+template <>
+class CStreamCaster<Strings::string, char const*> {
+  public:
+    static Strings::string cast(char const* source);
+};
+
+template <>
+class CStreamCaster<Strings::string, wchar_t const*> {
+  public:
+    static Strings::string cast(wchar_t const* source);
+};
+
+template <>
+class CStreamCaster<Strings::string, char*> : public CStreamCaster<Strings::string, char const*> {};
+
+template <>
+class CStreamCaster<Strings::string, wchar_t*>
+    : public CStreamCaster<Strings::string, wchar_t const*> {};
+
+/// Casts `source` to TTarget: a wide string from any type, or a number from a wide string. A
+/// pointer to characters is a zero-terminated text and must not be null.
+template <class TTarget, class TSource>
+TTarget stream_cast(TSource const& source) {
+    return CStreamCaster<TTarget, TSource>::cast(source);
+}
+
+} // namespace StdUtil
+
+#endif
