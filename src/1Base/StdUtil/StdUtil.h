@@ -1,8 +1,9 @@
-/// Additions to the standard library: stream casting and the bounds of arrays.
+/// Additions to the standard library: stream casting, the bounds of arrays, the global locale.
 #ifndef QORN_1BASE_STDUTIL_H
 #define QORN_1BASE_STDUTIL_H
 
 #include "1Base/StdUtil/StdUtilArray.h"
+#include "1Base/StdUtil/StdUtilLocale.h"
 #include "1Base/StdUtil/StdUtilStreamCast.h"
 
 #endif

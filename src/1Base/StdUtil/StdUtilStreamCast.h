@@ -16,12 +16,15 @@
 #ifndef QORN_1BASE_STDUTILSTREAMCAST_H
 #define QORN_1BASE_STDUTILSTREAMCAST_H
 
+#include "1Base/StdUtil/StdUtilLocale.h"
 #include "1Base/StdUtil/StdUtilStreamCastFailures.h"
+#include "1Base/StdUtil/_Imp/StdUtilDecimal.h"
 #include "1Base/Streams/StreamsBuffer.h"
 #include "1Base/Streams/StreamsString.h"
 #include "1Base/Strings/StringsKinds.h"
 
 #include <string>
+#include <type_traits>
 #include <typeinfo>
 
 namespace StdUtil {
@@ -37,6 +40,13 @@ class CStreamCaster<std::basic_string<TChar, TTraits, TAllocator>, TSource> {
     using TString = std::basic_string<TChar, TTraits, TAllocator>;
 
     static TString cast(TSource const& source) {
+        if constexpr (std::is_same_v<TString, Strings::string> &&
+                      Detail::isWrittenAsDecimal<TSource>) {
+            using TNumber =
+                std::conditional_t<std::is_signed_v<TSource>, long long, unsigned long long>;
+            if (isGlobalLocaleClassic())
+                return Detail::writeDecimal(static_cast<TNumber>(source));
+        }
         Streams::Detail::basic_ostringstream<TChar, TTraits, TAllocator> stream(
             static_cast<unsigned int>(std::ios_base::out));
         stream << source;
@@ -54,8 +64,13 @@ class CStreamCaster<TTarget, std::basic_string<TChar, TTraits, TAllocator>> {
     using TString = std::basic_string<TChar, TTraits, TAllocator>;
 
     static TTarget cast(TString const& source) {
-        Streams::basic_isbufstream<TChar, TTraits> stream(source.data(), source.size());
         TTarget target = 0;
+        if constexpr (std::is_same_v<TString, Strings::string> &&
+                      Detail::isReadAsDecimal<TTarget>) {
+            if (isGlobalLocaleClassic() && Detail::readDecimal(source, target))
+                return target;
+        }
+        Streams::basic_isbufstream<TChar, TTraits> stream(source.data(), source.size());
         stream >> target;
         if (stream.fail())
             Detail::throwStreamCastError(__FILE__, __LINE__, __PRETTY_FUNCTION__, __DATE__,
@@ -95,6 +110,21 @@ class CStreamCaster<Strings::string, char*> : public CStreamCaster<Strings::stri
 template <>
 class CStreamCaster<Strings::string, wchar_t*>
     : public CStreamCaster<Strings::string, wchar_t const*> {};
+
+// The pairs that the system uses everywhere.
+extern template class CStreamCaster<Strings::string, bool>;
+extern template class CStreamCaster<Strings::string, char>;
+extern template class CStreamCaster<Strings::string, wchar_t>;
+extern template class CStreamCaster<Strings::string, unsigned char>;
+extern template class CStreamCaster<Strings::string, unsigned short>;
+extern template class CStreamCaster<Strings::string, int>;
+extern template class CStreamCaster<Strings::string, unsigned int>;
+extern template class CStreamCaster<Strings::string, long>;
+extern template class CStreamCaster<Strings::string, unsigned long>;
+extern template class CStreamCaster<unsigned short, Strings::string>;
+extern template class CStreamCaster<int, Strings::string>;
+extern template class CStreamCaster<unsigned int, Strings::string>;
+extern template class CStreamCaster<long, Strings::string>;
 
 /// Casts `source` to TTarget: a wide string from any type, or a number from a wide string. A
 /// pointer to characters is a zero-terminated text and must not be null.
