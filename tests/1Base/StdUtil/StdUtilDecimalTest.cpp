@@ -8,8 +8,7 @@
 
 #include <gtest/gtest.h>
 
-#include <cstdlib>
-#include <iostream>
+#include <cstdio>
 #include <limits>
 #include <optional>
 #include <random>
@@ -23,10 +22,7 @@ using namespace StdUtilTest;
 
 constexpr int rounds = 150000;
 
-unsigned long seed() {
-    char const* const given = std::getenv("QORN_TEST_SEED");
-    return given != nullptr ? std::strtoul(given, nullptr, 10) : 20240229UL;
-}
+constexpr unsigned int seed = 20240229;
 
 template <class TNumber>
 std::wstring write(TNumber number) {
@@ -64,7 +60,7 @@ std::string codesOf(std::wstring const& text) {
 
 class CRandom {
   public:
-    CRandom() : engine_(seed()) {}
+    CRandom() : engine_(seed) {}
 
     std::size_t below(std::size_t bound) { return engine_() % bound; }
 
@@ -186,7 +182,7 @@ struct CRawTypeNames {
 template <class TNumber>
 class CStdUtilDecimalTest : public testing::Test {
   protected:
-    void SetUp() override { std::cout << "seed " << seed() << '\n'; }
+    void SetUp() override { std::printf("seed %u\n", seed); }
 
     void writeAtRandom() {
         for (int round = 0; round < rounds; ++round) {
