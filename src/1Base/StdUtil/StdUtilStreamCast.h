@@ -9,8 +9,9 @@
 /// Encoding::convert. A `char` array is no such kind: the stream widens its bytes one by one and
 /// decodes nothing, while the same bytes behind a `char const*` are decoded as UTF-8.
 ///
-/// A text may go on behind its number: what follows is not looked at. A stream that fails ends in
-/// Detail::throwStreamCastError; an exception of a type's own operator passes.
+/// A text may go on behind its number: what follows is not looked at. A stream left with failbit or
+/// badbit ends in Detail::throwStreamCastError; eofbit alone is no failure. An exception that a
+/// type's own operator throws passes.
 ///
 /// There is no shared state: casts may run on any thread.
 #ifndef QORN_1BASE_STDUTILSTREAMCAST_H

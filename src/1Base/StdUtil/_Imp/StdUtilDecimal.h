@@ -17,8 +17,8 @@ template <class TNumber>
 constexpr bool isReadAsDecimal = isOneOf<TNumber, short, unsigned short, int, unsigned int, long,
                                          unsigned long, long long, unsigned long long>;
 
-/// The types that a wide stream writes as a decimal number. It has no inserter of its own for the
-/// two small ones, so they go by way of `int` and are no characters there.
+/// The types that a wide stream writes as a decimal number. It has no inserter for signed and
+/// unsigned `char`: these go by way of `int` and are no characters there.
 template <class TNumber>
 constexpr bool isWrittenAsDecimal =
     isReadAsDecimal<TNumber> || isOneOf<TNumber, bool, signed char, unsigned char>;
