@@ -36,6 +36,8 @@ extern "C" {
 /// A string of `numBytes` bytes in `encoding`; null where the bytes are malformed, the encoding is
 /// not served, or memory is short. UTF-8 and UTF-32 are read strictly; one leading UTF-8 byte order
 /// mark is removed whatever `isExternalRepresentation` says; UTF-16 units are taken as they are.
+/// Bytes behind the last whole unit of UTF-16 or UTF-32 are ignored, but UTF-32 of one to three
+/// bytes is malformed.
 CFStringRef CFStringCreateWithBytes(CFAllocatorRef allocator, UInt8 const* bytes, CFIndex numBytes,
                                     CFStringEncoding encoding, Boolean isExternalRepresentation);
 

@@ -1,4 +1,5 @@
-// UTF-32 in host order. Reading is strict; an unpaired surrogate is written as the loss byte.
+// UTF-32 in host order. Reading is strict, but for bytes behind the last whole element, which are
+// ignored; an unpaired surrogate is written as the loss byte.
 
 #include "0Platform/CoreFoundation/_Imp/CFCodec.h"
 #include "0Platform/CoreFoundation/_Imp/CFUnicode.h"
@@ -54,9 +55,9 @@ class CodecUTF32 final : public Codec {
     }
 
     CFIndex decode(UInt8 const* bytes, CFIndex count, UniChar* units) const noexcept override {
-        if (count % 4 != 0)
+        if (count > 0 && count < 4)
             return -1;
-        UInt8 const* const end = bytes + count;
+        UInt8 const* const end = bytes + count / 4 * 4;
         UniChar* out = units;
         while (bytes != end) {
             if (end - bytes >= 4 * blockSize && decodeBlock(bytes, out)) {
