@@ -1,0 +1,228 @@
+#include "support/PlatformCalls.h"
+
+#include <utility>
+
+namespace TestSupport {
+namespace {
+
+CPlatformCalls* recorder = nullptr;
+int depth = 0;
+
+} // namespace
+
+/// One call on its way through a wrapper: `forward` says whether the platform gets to see it.
+class CPlatformWatch {
+  public:
+    explicit CPlatformWatch(CPlatformCall details) : call(std::move(details)) { ++depth; }
+
+    ~CPlatformWatch() {
+        if (isWatched())
+            recorder->calls_.push_back(call);
+        --depth;
+    }
+
+    CPlatformWatch(CPlatformWatch const&) = delete;
+    CPlatformWatch& operator=(CPlatformWatch const&) = delete;
+
+    bool forward() {
+        if (!isWatched())
+            return true;
+        if (recorder->observer_)
+            recorder->observer_(call);
+        auto const failure = recorder->failures_.find(call.function);
+        return failure == recorder->failures_.end() || --failure->second != 0;
+    }
+
+    CPlatformCall call;
+
+  private:
+    static bool isWatched() { return recorder != nullptr && depth == 1; }
+};
+
+CPlatformCalls::CPlatformCalls() {
+    recorder = this;
+}
+
+CPlatformCalls::~CPlatformCalls() {
+    recorder = nullptr;
+}
+
+void CPlatformCalls::fail(std::string const& function, int nth) {
+    failures_[function] = nth;
+}
+
+void CPlatformCalls::observe(std::function<void(CPlatformCall const&)> observer) {
+    observer_ = std::move(observer);
+}
+
+std::vector<CPlatformCall> CPlatformCalls::of(std::string const& function) const {
+    std::vector<CPlatformCall> calls;
+    for (CPlatformCall const& call : calls_) {
+        if (call.function == function)
+            calls.push_back(call);
+    }
+    return calls;
+}
+
+std::vector<std::string> CPlatformCalls::names() const {
+    std::vector<std::string> names;
+    for (CPlatformCall const& call : calls_)
+        names.push_back(call.function);
+    return names;
+}
+
+} // namespace TestSupport
+
+using TestSupport::CPlatformCall;
+using TestSupport::CPlatformWatch;
+
+namespace {
+
+CPlatformCall callOf(char const* function, CFTypeRef object = nullptr) {
+    CPlatformCall call;
+    call.function = function;
+    call.object = object;
+    return call;
+}
+
+} // namespace
+
+extern "C" {
+
+CFStringRef __real_CFStringCreateWithBytes(CFAllocatorRef allocator, UInt8 const* bytes,
+                                           CFIndex numBytes, CFStringEncoding encoding,
+                                           Boolean isExternalRepresentation);
+CFStringRef __real_CFStringCreateWithCharacters(CFAllocatorRef allocator, UniChar const* characters,
+                                                CFIndex numChars);
+CFStringRef __real_CFStringCreateWithPascalString(CFAllocatorRef allocator,
+                                                  ConstStr255Param pascalString,
+                                                  CFStringEncoding encoding);
+CFMutableStringRef __real_CFStringCreateMutableCopy(CFAllocatorRef allocator, CFIndex maxLength,
+                                                    CFStringRef string);
+CFIndex __real_CFStringGetLength(CFStringRef string);
+UniChar const* __real_CFStringGetCharactersPtr(CFStringRef string);
+void __real_CFStringGetCharacters(CFStringRef string, CFRange range, UniChar* buffer);
+CFIndex __real_CFStringGetBytes(CFStringRef string, CFRange range, CFStringEncoding encoding,
+                                UInt8 lossByte, Boolean isExternalRepresentation, UInt8* buffer,
+                                CFIndex maxBufLen, CFIndex* usedBufLen);
+void __real_CFStringNormalize(CFMutableStringRef string, CFStringNormalizationForm form);
+CFTypeRef __real_CFRetain(CFTypeRef object);
+void __real_CFRelease(CFTypeRef object);
+
+CFStringRef __wrap_CFStringCreateWithBytes(CFAllocatorRef allocator, UInt8 const* bytes,
+                                           CFIndex numBytes, CFStringEncoding encoding,
+                                           Boolean isExternalRepresentation) {
+    CPlatformWatch watch(callOf("CFStringCreateWithBytes"));
+    watch.call.allocator = allocator;
+    watch.call.input = bytes;
+    watch.call.inputCount = numBytes;
+    watch.call.encoding = encoding;
+    watch.call.external = isExternalRepresentation;
+    if (!watch.forward())
+        return nullptr;
+    CFStringRef const made = __real_CFStringCreateWithBytes(allocator, bytes, numBytes, encoding,
+                                                            isExternalRepresentation);
+    watch.call.object = made;
+    return made;
+}
+
+CFStringRef __wrap_CFStringCreateWithCharacters(CFAllocatorRef allocator, UniChar const* characters,
+                                                CFIndex numChars) {
+    CPlatformWatch watch(callOf("CFStringCreateWithCharacters"));
+    watch.call.allocator = allocator;
+    watch.call.input = characters;
+    watch.call.inputCount = numChars;
+    if (!watch.forward())
+        return nullptr;
+    CFStringRef const made = __real_CFStringCreateWithCharacters(allocator, characters, numChars);
+    watch.call.object = made;
+    return made;
+}
+
+CFStringRef __wrap_CFStringCreateWithPascalString(CFAllocatorRef allocator,
+                                                  ConstStr255Param pascalString,
+                                                  CFStringEncoding encoding) {
+    CPlatformWatch watch(callOf("CFStringCreateWithPascalString"));
+    watch.call.allocator = allocator;
+    watch.call.input = pascalString;
+    watch.call.encoding = encoding;
+    if (!watch.forward())
+        return nullptr;
+    CFStringRef const made =
+        __real_CFStringCreateWithPascalString(allocator, pascalString, encoding);
+    watch.call.object = made;
+    return made;
+}
+
+CFMutableStringRef __wrap_CFStringCreateMutableCopy(CFAllocatorRef allocator, CFIndex maxLength,
+                                                    CFStringRef string) {
+    CPlatformWatch watch(callOf("CFStringCreateMutableCopy"));
+    watch.call.allocator = allocator;
+    watch.call.capacity = maxLength;
+    watch.call.source = string;
+    if (!watch.forward())
+        return nullptr;
+    CFMutableStringRef const made = __real_CFStringCreateMutableCopy(allocator, maxLength, string);
+    watch.call.object = made;
+    return made;
+}
+
+CFIndex __wrap_CFStringGetLength(CFStringRef string) {
+    CPlatformWatch watch(callOf("CFStringGetLength", string));
+    return watch.call.result = watch.forward() ? __real_CFStringGetLength(string) : 0;
+}
+
+UniChar const* __wrap_CFStringGetCharactersPtr(CFStringRef string) {
+    CPlatformWatch watch(callOf("CFStringGetCharactersPtr", string));
+    return watch.forward() ? __real_CFStringGetCharactersPtr(string) : nullptr;
+}
+
+void __wrap_CFStringGetCharacters(CFStringRef string, CFRange range, UniChar* buffer) {
+    CPlatformWatch watch(callOf("CFStringGetCharacters", string));
+    watch.call.range = range;
+    watch.call.buffer = buffer;
+    if (watch.forward())
+        __real_CFStringGetCharacters(string, range, buffer);
+}
+
+CFIndex __wrap_CFStringGetBytes(CFStringRef string, CFRange range, CFStringEncoding encoding,
+                                UInt8 lossByte, Boolean isExternalRepresentation, UInt8* buffer,
+                                CFIndex maxBufLen, CFIndex* usedBufLen) {
+    CPlatformWatch watch(callOf("CFStringGetBytes", string));
+    CPlatformCall& call = watch.call;
+    call.range = range;
+    call.encoding = encoding;
+    call.lossByte = lossByte;
+    call.external = isExternalRepresentation;
+    call.buffer = buffer;
+    call.room = maxBufLen;
+    if (watch.forward())
+        call.result =
+            __real_CFStringGetBytes(string, range, encoding, lossByte, isExternalRepresentation,
+                                    buffer, maxBufLen, &call.used);
+    if (buffer != nullptr)
+        call.written.assign(reinterpret_cast<char const*>(buffer),
+                            static_cast<std::size_t>(call.used));
+    if (usedBufLen != nullptr)
+        *usedBufLen = call.used;
+    return call.result;
+}
+
+void __wrap_CFStringNormalize(CFMutableStringRef string, CFStringNormalizationForm form) {
+    CPlatformWatch watch(callOf("CFStringNormalize", string));
+    watch.call.form = form;
+    if (watch.forward())
+        __real_CFStringNormalize(string, form);
+}
+
+CFTypeRef __wrap_CFRetain(CFTypeRef object) {
+    CPlatformWatch watch(callOf("CFRetain", object));
+    return watch.forward() ? __real_CFRetain(object) : object;
+}
+
+void __wrap_CFRelease(CFTypeRef object) {
+    CPlatformWatch watch(callOf("CFRelease", object));
+    if (watch.forward())
+        __real_CFRelease(object);
+}
+}
