@@ -5,8 +5,8 @@
 namespace TestSupport {
 namespace {
 
-CPlatformCalls* recorder = nullptr;
-int depth = 0;
+thread_local CPlatformCalls* recorder = nullptr;
+thread_local int depth = 0;
 
 } // namespace
 
@@ -85,6 +85,15 @@ CPlatformCall callOf(char const* function, CFTypeRef object = nullptr) {
     return call;
 }
 
+// A call that makes an object, by `make`.
+template <class TMake>
+auto create(CPlatformCall const& call, TMake const& make) {
+    CPlatformWatch watch(call);
+    auto const made = watch.forward() ? make() : nullptr;
+    watch.call.object = made;
+    return made;
+}
+
 } // namespace
 
 extern "C" {
@@ -112,59 +121,48 @@ void __real_CFRelease(CFTypeRef object);
 CFStringRef __wrap_CFStringCreateWithBytes(CFAllocatorRef allocator, UInt8 const* bytes,
                                            CFIndex numBytes, CFStringEncoding encoding,
                                            Boolean isExternalRepresentation) {
-    CPlatformWatch watch(callOf("CFStringCreateWithBytes"));
-    watch.call.allocator = allocator;
-    watch.call.input = bytes;
-    watch.call.inputCount = numBytes;
-    watch.call.encoding = encoding;
-    watch.call.external = isExternalRepresentation;
-    if (!watch.forward())
-        return nullptr;
-    CFStringRef const made = __real_CFStringCreateWithBytes(allocator, bytes, numBytes, encoding,
-                                                            isExternalRepresentation);
-    watch.call.object = made;
-    return made;
+    CPlatformCall call = callOf("CFStringCreateWithBytes");
+    call.allocator = allocator;
+    call.input = bytes;
+    call.inputCount = numBytes;
+    call.encoding = encoding;
+    call.external = isExternalRepresentation;
+    return create(call, [=] {
+        return __real_CFStringCreateWithBytes(allocator, bytes, numBytes, encoding,
+                                              isExternalRepresentation);
+    });
 }
 
 CFStringRef __wrap_CFStringCreateWithCharacters(CFAllocatorRef allocator, UniChar const* characters,
                                                 CFIndex numChars) {
-    CPlatformWatch watch(callOf("CFStringCreateWithCharacters"));
-    watch.call.allocator = allocator;
-    watch.call.input = characters;
-    watch.call.inputCount = numChars;
-    if (!watch.forward())
-        return nullptr;
-    CFStringRef const made = __real_CFStringCreateWithCharacters(allocator, characters, numChars);
-    watch.call.object = made;
-    return made;
+    CPlatformCall call = callOf("CFStringCreateWithCharacters");
+    call.allocator = allocator;
+    call.input = characters;
+    call.inputCount = numChars;
+    return create(
+        call, [=] { return __real_CFStringCreateWithCharacters(allocator, characters, numChars); });
 }
 
 CFStringRef __wrap_CFStringCreateWithPascalString(CFAllocatorRef allocator,
                                                   ConstStr255Param pascalString,
                                                   CFStringEncoding encoding) {
-    CPlatformWatch watch(callOf("CFStringCreateWithPascalString"));
-    watch.call.allocator = allocator;
-    watch.call.input = pascalString;
-    watch.call.encoding = encoding;
-    if (!watch.forward())
-        return nullptr;
-    CFStringRef const made =
-        __real_CFStringCreateWithPascalString(allocator, pascalString, encoding);
-    watch.call.object = made;
-    return made;
+    CPlatformCall call = callOf("CFStringCreateWithPascalString");
+    call.allocator = allocator;
+    call.input = pascalString;
+    call.encoding = encoding;
+    return create(call, [=] {
+        return __real_CFStringCreateWithPascalString(allocator, pascalString, encoding);
+    });
 }
 
 CFMutableStringRef __wrap_CFStringCreateMutableCopy(CFAllocatorRef allocator, CFIndex maxLength,
                                                     CFStringRef string) {
-    CPlatformWatch watch(callOf("CFStringCreateMutableCopy"));
-    watch.call.allocator = allocator;
-    watch.call.capacity = maxLength;
-    watch.call.source = string;
-    if (!watch.forward())
-        return nullptr;
-    CFMutableStringRef const made = __real_CFStringCreateMutableCopy(allocator, maxLength, string);
-    watch.call.object = made;
-    return made;
+    CPlatformCall call = callOf("CFStringCreateMutableCopy");
+    call.allocator = allocator;
+    call.capacity = maxLength;
+    call.source = string;
+    return create(call,
+                  [=] { return __real_CFStringCreateMutableCopy(allocator, maxLength, string); });
 }
 
 CFIndex __wrap_CFStringGetLength(CFStringRef string) {

@@ -39,7 +39,7 @@ struct CPlatformCall {
 };
 
 /// Records every call into the platform while it lives, in order. What the platform calls within
-/// itself is left out. One at a time, on one thread.
+/// itself is left out, and what other threads call. One at a time on a thread.
 class CPlatformCalls {
   public:
     CPlatformCalls();
