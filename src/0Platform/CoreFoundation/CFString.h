@@ -65,7 +65,8 @@ void CFStringGetCharacters(CFStringRef string, CFRange range, UniChar* buffer);
 /// Converts the units of `range` into `encoding` and returns how many of them were converted. Only
 /// whole characters are written, at most `maxBufLen` bytes; with a null buffer nothing is written
 /// and no limit holds. `lossByte` stands in for a character that the encoding lacks; 0 stops
-/// there. `usedBufLen`, where not null, receives the byte count, a failure included.
+/// there, and UTF-8 stops at an unpaired surrogate whatever `lossByte` says. `usedBufLen`, where
+/// not null, receives the byte count, a failure included.
 CFIndex CFStringGetBytes(CFStringRef string, CFRange range, CFStringEncoding encoding,
                          UInt8 lossByte, Boolean isExternalRepresentation, UInt8* buffer,
                          CFIndex maxBufLen, CFIndex* usedBufLen);
