@@ -1,5 +1,7 @@
 #include "0Platform/CoreFoundation/_Imp/CFCodec.h"
 
+#include <CoreFoundation/CFStringEncodingExt.h>
+
 namespace CFPlatform {
 
 Codec const* findCodec(CFStringEncoding encoding) noexcept {
@@ -11,8 +13,10 @@ Codec const* findCodec(CFStringEncoding encoding) noexcept {
         return &codecUTF16();
     case kCFStringEncodingUTF32LE:
         return &codecUTF32();
+    case kCFStringEncodingMacHFS:
+        return codecComposed();
     default:
-        return nullptr;
+        return findLegacyCodec(encoding);
     }
 }
 

@@ -38,12 +38,19 @@ class Codec {
     ~Codec() = default;
 };
 
-/// The codec behind a platform value; null where the encoding is not served.
+/// The codec behind a platform value; null where the encoding is not served. A legacy encoding's
+/// tables are read or built at its first use, on whichever thread that is.
 Codec const* findCodec(CFStringEncoding encoding) noexcept;
 
 Codec const& codecUTF8() noexcept;
 Codec const& codecUTF16() noexcept;
 Codec const& codecUTF32() noexcept;
+
+/// UTF-16 in canonical composition; null where ICU's data is missing.
+Codec const* codecComposed() noexcept;
+
+/// The codec of an encoding of one or two bytes a character.
+Codec const* findLegacyCodec(CFStringEncoding encoding) noexcept;
 
 } // namespace CFPlatform
 
