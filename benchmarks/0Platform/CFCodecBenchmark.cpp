@@ -169,7 +169,7 @@ stringUTF16 textOf(CEncoding const& encoding, char16_t (*draw)(std::mt19937& ran
     return text;
 }
 
-// A contender that gives another result measures other work, and is not measured.
+// A contender that gives another result measures other work: that ends the program.
 template <class TContender>
 void addContender(std::string const& row, char const* name, CEncoding const& encoding,
                   stringUTF16 const& units) {
