@@ -121,6 +121,14 @@ TEST_F(CFStringTest, APascalStringMayBeEmptyOrFull) {
     EXPECT_EQ(all.units(), std::u16string(255, u'x'));
 }
 
+TEST_F(CFStringTest, APascalStringMayBeMacRoman) {
+    unsigned char const pascal[] = {5, 'c', 'a', 'f', 0x8E, 0xA5};
+    CPlatformString const text(
+        CFStringCreateWithPascalString(kCFAllocatorDefault, pascal, kCFStringEncodingMacRoman));
+    ASSERT_NE(text.get(), nullptr);
+    EXPECT_EQ(text.units(), u"caf\u00E9\u2022");
+}
+
 TEST_F(CFStringTest, AMalformedPascalStringGivesNull) {
     unsigned char const pascal[] = {2, 'a', 0xFF};
     EXPECT_EQ(CFStringCreateWithPascalString(kCFAllocatorDefault, pascal, kCFStringEncodingUTF8),

@@ -170,6 +170,24 @@ TEST_F(CMacOSCFStringConverterTest, APascalStringIsHandedOverAsMacRoman) {
     EXPECT_EQ(calls.all()[2].input, variable);
 }
 
+TEST_F(CMacOSCFStringConverterTest, APascalStringIsReadAsMacRoman) {
+    unsigned char const pascal[] = {5, 'c', 'a', 'f', 0x8E, 0xA5, 'x'};
+    CPlatformString const text(GetCFString(pascal));
+    ASSERT_NE(text.get(), nullptr);
+    EXPECT_EQ(text.units(), u"caf\u00E9\u2022");
+    EXPECT_EQ(CFGetRetainCount(text.get()), 1);
+
+    unsigned char const empty[] = {0};
+    CPlatformString const none(GetCFString(empty));
+    ASSERT_NE(none.get(), nullptr);
+    EXPECT_EQ(none.units(), u"");
+}
+
+TEST_F(CMacOSCFStringConverterTest, BytesAreReadAsLatin1) {
+    CPlatformString const text(GetCFString(TestSupport::bytesOf("caf\xE9")));
+    EXPECT_EQ(text.units(), u"caf\u00E9");
+}
+
 TEST_F(CMacOSCFStringConverterTest, EveryOtherKindGoesThroughUTF16) {
     CPlatformCalls const calls;
     CPlatformString const wide(GetCFString(Strings::string(L"caf\u00E9 \U0001F600")));

@@ -30,6 +30,12 @@ TEST_F(CMacOSTempCFStringTest, ItIsBuiltFromAnyStringKind) {
     EXPECT_EQ(unitsOf(CTempCFString("caf\xC3\xA9")), u"caf\u00E9");
 }
 
+TEST_F(CMacOSTempCFStringTest, ItIsBuiltFromBytesAndFromAPascalString) {
+    unsigned char const pascal[] = {4, 'c', 'a', 'f', 0x8E};
+    EXPECT_EQ(unitsOf(CTempCFString(TestSupport::bytesOf("caf\xE9"))), u"caf\u00E9");
+    EXPECT_EQ(unitsOf(CTempCFString(pascal)), u"caf\u00E9");
+}
+
 TEST_F(CMacOSTempCFStringTest, AWideTextComesBackUnchanged) {
     Strings::string const text = L"caf\u00E9 \U0001F600";
     CTempCFString const temp(text);
