@@ -72,7 +72,15 @@ CFIndex CFStringGetBytes(CFStringRef string, CFRange range, CFStringEncoding enc
                          CFIndex maxBufLen, CFIndex* usedBufLen);
 
 /// Compares the units of `range` in `string1` with the whole of `string2`. Order is by code point,
-/// never by collation; no locale takes part.
+/// never by collation; no locale takes part. An embedded zero is a character like any other.
+///
+/// Two sets of options are served, and what any other gives is not defined:
+/// kCFCompareCaseInsensitive alone (1), and together with kCFCompareNumerically and
+/// kCFCompareDiacriticInsensitive (193). 1 applies the full case folding of Unicode, so a sharp s
+/// is "ss"; a composed letter differs from the letter and its mark. 193 also ignores the accents of
+/// Latin, Greek and Cyrillic letters and marks at the end, and orders runs of ASCII digits by their
+/// numeric value. Neither is promised to be transitive or the same both ways round: with
+/// characters that fold to several, the framework's own answers are not.
 CFComparisonResult CFStringCompareWithOptions(CFStringRef string1, CFStringRef string2,
                                               CFRange range, CFStringCompareFlags options);
 
