@@ -8,8 +8,10 @@ typedef struct __CFLocale const* CFLocaleRef;
 
 extern "C" {
 
-/// The process's locale at this moment, as the environment names it (LC_ALL, LC_CTYPE, LANG, in
-/// this order). Owned by the caller.
+/// The process's locale at this moment, as the environment names it: the first of LC_ALL, LC_CTYPE
+/// and LANG that is set and not empty, without codeset and modifier ("tr_TR.UTF-8@x" is "tr_TR").
+/// "C", "POSIX" and what is no locale's name are the root locale. Owned by the caller; null where
+/// memory is short. Another thread must not change the environment meanwhile.
 CFLocaleRef CFLocaleCopyCurrent(void);
 }
 
