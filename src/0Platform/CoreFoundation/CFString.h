@@ -84,7 +84,9 @@ CFIndex CFStringGetBytes(CFStringRef string, CFRange range, CFStringEncoding enc
 CFComparisonResult CFStringCompareWithOptions(CFStringRef string1, CFStringRef string2,
                                               CFRange range, CFStringCompareFlags options);
 
-/// Full case mapping in place by the rules of `locale`; null is the root locale.
+/// Full case mapping in place by the rules of `locale`; null is the root locale. Dots of Turkish,
+/// Azeri and Lithuanian letters follow the language. In Greek, capital letters lose the tonos of
+/// composed vowels.
 void CFStringUppercase(CFMutableStringRef string, CFLocaleRef locale);
 void CFStringLowercase(CFMutableStringRef string, CFLocaleRef locale);
 
