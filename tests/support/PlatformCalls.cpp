@@ -115,6 +115,11 @@ CFIndex __real_CFStringGetBytes(CFStringRef string, CFRange range, CFStringEncod
                                 UInt8 lossByte, Boolean isExternalRepresentation, UInt8* buffer,
                                 CFIndex maxBufLen, CFIndex* usedBufLen);
 void __real_CFStringNormalize(CFMutableStringRef string, CFStringNormalizationForm form);
+CFComparisonResult __real_CFStringCompareWithOptions(CFStringRef string1, CFStringRef string2,
+                                                     CFRange range, CFStringCompareFlags options);
+void __real_CFStringUppercase(CFMutableStringRef string, CFLocaleRef locale);
+void __real_CFStringLowercase(CFMutableStringRef string, CFLocaleRef locale);
+CFLocaleRef __real_CFLocaleCopyCurrent(void);
 CFTypeRef __real_CFRetain(CFTypeRef object);
 void __real_CFRelease(CFTypeRef object);
 
@@ -211,6 +216,40 @@ void __wrap_CFStringNormalize(CFMutableStringRef string, CFStringNormalizationFo
     watch.call.form = form;
     if (watch.forward())
         __real_CFStringNormalize(string, form);
+}
+
+CFComparisonResult __wrap_CFStringCompareWithOptions(CFStringRef string1, CFStringRef string2,
+                                                     CFRange range, CFStringCompareFlags options) {
+    CPlatformWatch watch(callOf("CFStringCompareWithOptions", string1));
+    watch.call.source = string2;
+    watch.call.range = range;
+    watch.call.options = options;
+    CFComparisonResult const result =
+        watch.forward() ? __real_CFStringCompareWithOptions(string1, string2, range, options)
+                        : kCFCompareEqualTo;
+    watch.call.result = result;
+    return result;
+}
+
+void __wrap_CFStringUppercase(CFMutableStringRef string, CFLocaleRef locale) {
+    CPlatformWatch watch(callOf("CFStringUppercase", string));
+    watch.call.locale = locale;
+    if (watch.forward())
+        __real_CFStringUppercase(string, locale);
+}
+
+void __wrap_CFStringLowercase(CFMutableStringRef string, CFLocaleRef locale) {
+    CPlatformWatch watch(callOf("CFStringLowercase", string));
+    watch.call.locale = locale;
+    if (watch.forward())
+        __real_CFStringLowercase(string, locale);
+}
+
+CFLocaleRef __wrap_CFLocaleCopyCurrent(void) {
+    CPlatformWatch watch(callOf("CFLocaleCopyCurrent"));
+    CFLocaleRef const made = watch.forward() ? __real_CFLocaleCopyCurrent() : nullptr;
+    watch.call.object = made;
+    return made;
 }
 
 CFTypeRef __wrap_CFRetain(CFTypeRef object) {

@@ -1,5 +1,5 @@
-/// Watches the calls that the code under test makes into the platform's strings, and lets single
-/// ones fail. A program that uses it links qorn_test_platform_calls (Linux).
+/// Watches the calls that the code under test makes into the platform's strings and locales, and
+/// lets single ones fail. A program that uses it links qorn_test_platform_calls (Linux).
 ///
 ///     TestSupport::CPlatformCalls calls;
 ///     calls.fail("CFStringGetBytes", 2);    // the second call from here answers 0
@@ -21,8 +21,10 @@ namespace TestSupport {
 struct CPlatformCall {
     std::string function;
     CFAllocatorRef allocator = nullptr;
-    CFTypeRef object = nullptr;  // what is worked on; a Create function: what it made
-    CFTypeRef source = nullptr;  // what is copied from
+    CFTypeRef object = nullptr; // what is worked on; a Create function: what it made
+    CFTypeRef source = nullptr; // what is copied from, or compared with
+    CFTypeRef locale = nullptr;
+    CFOptionFlags options = 0;   // of a comparison
     void const* input = nullptr; // bytes or units given
     CFIndex inputCount = 0;      // their number
     CFStringEncoding encoding = 0;
@@ -47,8 +49,8 @@ class CPlatformCalls {
     CPlatformCalls(CPlatformCalls const&) = delete;
     CPlatformCalls& operator=(CPlatformCalls const&) = delete;
 
-    /// The `nth` call of `function` from now on does not reach the platform: a Create function and
-    /// CFStringGetCharactersPtr answer null, CFStringGetBytes answers 0.
+    /// The `nth` call of `function` from now on does not reach the platform: a Create or
+    /// Copy function and CFStringGetCharactersPtr answer null, all others do nothing and answer 0.
     void fail(std::string const& function, int nth = 1);
 
     /// Called before each call is passed on.
