@@ -109,7 +109,10 @@ TEST_F(CFStringCaseTest, ASigmaIsFinalBehindALetterAtTheEndOfAWord) {
         EXPECT_EQ(lower(locale, u"\u0391\u03A3"), u"\u03B1\u03C2") << locale;
         EXPECT_EQ(lower(locale, u"\u0391\u03A3 \u0391"), u"\u03B1\u03C2 \u03B1") << locale;
         EXPECT_EQ(lower(locale, u"\u03A3\u0391"), u"\u03C3\u03B1") << locale;
-        // Marks and soft hyphens stand within a word; a full stop ends it.
+        // Marks, apostrophes and soft hyphens stand within a word; a full stop ends it.
+        EXPECT_EQ(lower(locale, u"\u0391\u03A3'\u0391\u2019\u03A3'"),
+                  u"\u03B1\u03C3'\u03B1\u2019\u03C2'")
+            << locale;
         EXPECT_EQ(lower(locale, u"\u0391\u0301\u03A3\u0301\u00AD\u0391"),
                   u"\u03B1\u0301\u03C3\u0301\u00AD\u03B1")
             << locale;

@@ -60,11 +60,6 @@ bool isMark(UInt32 codePoint) noexcept {
                U_GCB_EXTEND;
 }
 
-FoldedCluster::~FoldedCluster() {
-    if (values_ != inline_)
-        std::free(values_);
-}
-
 bool FoldedCluster::fold(UInt32 character, UnitSpan const& text, CFIndex index,
                          Folding folding) noexcept {
     count_ = 0;

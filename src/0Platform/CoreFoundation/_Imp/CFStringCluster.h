@@ -7,6 +7,8 @@
 
 #include <CoreFoundation/CFString.h>
 
+#include <cstdlib>
+
 namespace CFPlatform {
 
 /// Units of a text that are looked at, not owned.
@@ -49,7 +51,10 @@ bool isMark(UInt32 codePoint) noexcept;
 class FoldedCluster {
   public:
     FoldedCluster() noexcept {}
-    ~FoldedCluster();
+    ~FoldedCluster() {
+        if (values_ != inline_)
+            std::free(values_);
+    }
     FoldedCluster(FoldedCluster const&) = delete;
     FoldedCluster& operator=(FoldedCluster const&) = delete;
 
