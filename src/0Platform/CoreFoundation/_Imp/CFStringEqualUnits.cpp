@@ -94,9 +94,10 @@ CFIndex countCaseEqual(UniChar const* first, UniChar const* second, CFIndex coun
 // True where both units are stepped over alone. Units that only fold to the same take the marks
 // behind them along, so there must be none, on neither side.
 bool isNaturallyEqual(FoldTable const& table, UniChar const* first, UniChar const* second) {
-    bool const isEqual = lowerUnit(first[0]) == lowerUnit(second[0]);
-    bool const mayFold = !table.mayBeMark(first[1]) & !table.mayBeMark(second[1]);
-    return (table[first[0]] == table[second[0]]) & (isEqual | mayFold) & !isDigit(first[0]);
+    if (table[first[0]] != table[second[0]] || isDigit(first[0]))
+        return false;
+    return lowerUnit(first[0]) == lowerUnit(second[0]) ||
+           !(table.mayBeMark(first[1]) || table.mayBeMark(second[1]));
 }
 
 // Leaves the last unit, behind which there is nothing to look at.
