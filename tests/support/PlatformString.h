@@ -11,6 +11,13 @@
 
 namespace TestSupport {
 
+/// One code point as one or two units; a surrogate as itself.
+inline std::u16string unitsOfCodePoint(char32_t c) {
+    if (c < 0x10000)
+        return std::u16string(1, static_cast<char16_t>(c));
+    return {static_cast<char16_t>(0xD7C0 + (c >> 10)), static_cast<char16_t>(0xDC00 + (c & 0x3FF))};
+}
+
 /// Owns a platform string, which may be null.
 class CPlatformString {
   public:

@@ -5,7 +5,6 @@
 #include "support/TableFile.h"
 
 #include <unicode/ustring.h>
-#include <unicode/utf16.h>
 
 #include <cstdlib>
 #include <string>
@@ -87,10 +86,7 @@ TEST_F(CFStringCaseTest, ZerosAndUnpairedSurrogatesStay) {
 // Alone, no character depends on neighbours: then all that the framework and ICU give is the same.
 TEST_F(CFStringCaseTest, EveryCodePointAloneIsMappedByICU) {
     for (char32_t c = 0; c <= 0x10FFFF; ++c) {
-        std::u16string const text = c < 0x10000
-                                        ? std::u16string(1, static_cast<char16_t>(c))
-                                        : std::u16string{static_cast<char16_t>(U16_LEAD(c)),
-                                                         static_cast<char16_t>(U16_TRAIL(c))};
+        std::u16string const text = TestSupport::unitsOfCodePoint(c);
         std::u16string expected(8, u'\0');
         UErrorCode status = U_ZERO_ERROR;
         expected.resize(static_cast<std::size_t>(u_strToUpper(

@@ -132,10 +132,7 @@ TEST_F(CFStringCompareRandomTest, EveryPairOfCharactersComparesAsTheRulesSay) {
 // that spare look-ups hold for all of them.
 TEST_F(CFStringCompareRandomTest, EveryCodePointFoldsAsItsPropertiesSay) {
     for (UChar32 c = 0; c <= 0x10FFFF; ++c) {
-        std::u16string const text = c < 0x10000
-                                        ? std::u16string(1, static_cast<char16_t>(c))
-                                        : std::u16string{static_cast<char16_t>(U16_LEAD(c)),
-                                                         static_cast<char16_t>(U16_TRAIL(c))};
+        std::u16string const text = TestSupport::unitsOfCodePoint(static_cast<char32_t>(c));
         UErrorCode status = U_ZERO_ERROR;
         std::u16string other(8, u'\0');
         other.resize(static_cast<std::size_t>(u_strFoldCase(other.data(), 8, text.data(),

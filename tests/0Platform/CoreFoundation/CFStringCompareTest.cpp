@@ -162,10 +162,7 @@ TEST_F(CFStringCompareTest, APairThatTheRangeCutsIsNoCharacter) {
 
 TEST_F(CFStringCompareTest, EveryCodePointIsEqualToItself) {
     for (char32_t c = 0; c <= 0x10FFFF; ++c) {
-        std::u16string const text =
-            c < 0x10000 ? std::u16string(1, static_cast<char16_t>(c))
-                        : std::u16string{static_cast<char16_t>(0xD7C0 + (c >> 10)),
-                                         static_cast<char16_t>(0xDC00 + (c & 0x3FF))};
+        std::u16string const text = TestSupport::unitsOfCodePoint(c);
         ASSERT_EQ(compared(text, text, ignoringCase), 0) << static_cast<unsigned long>(c);
         ASSERT_EQ(compared(text, text, naturally), 0) << static_cast<unsigned long>(c);
     }

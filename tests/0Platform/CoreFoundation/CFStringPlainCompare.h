@@ -5,6 +5,8 @@
 #ifndef QORN_TESTS_CFSTRINGPLAINCOMPARE_H
 #define QORN_TESTS_CFSTRINGPLAINCOMPARE_H
 
+#include "support/PlatformString.h"
+
 #include <unicode/uchar.h>
 #include <unicode/unorm2.h>
 #include <unicode/ustring.h>
@@ -85,15 +87,9 @@ class CPlainCompare {
         return text;
     }
 
-    static std::u16string unitsOf(char32_t c) {
-        if (c < 0x10000)
-            return std::u16string(1, static_cast<char16_t>(c));
-        return {static_cast<char16_t>(U16_LEAD(c)), static_cast<char16_t>(U16_TRAIL(c))};
-    }
-
     static std::u32string decomposed(char32_t c) {
         UErrorCode status = U_ZERO_ERROR;
-        std::u16string const source = unitsOf(c);
+        std::u16string const source = TestSupport::unitsOfCodePoint(c);
         std::u16string target(32, u'\0');
         int32_t const length =
             unorm2_normalize(unorm2_getNFDInstance(&status), source.data(),
@@ -103,7 +99,7 @@ class CPlainCompare {
 
     static std::u32string folded(char32_t c) {
         UErrorCode status = U_ZERO_ERROR;
-        std::u16string const source = unitsOf(c);
+        std::u16string const source = TestSupport::unitsOfCodePoint(c);
         std::u16string target(32, u'\0');
         int32_t const length =
             u_strFoldCase(target.data(), 32, source.data(), static_cast<int32_t>(source.size()),

@@ -181,12 +181,14 @@ TEST_F(CStringsCompareTest, InvalidTextOnEitherSideEndsInTheConversionsFailure) 
 // A conversion that the platform lets down in the middle keeps its own string; nothing else is
 // left.
 TEST_F(CStringsCompareTest, AFailedReadLeavesNoMoreThanItsOwnString) {
+    long const before = TestSupport::liveObjects();
     for (int nth = 1; nth <= 4; ++nth) {
         CPlatformCalls calls;
         calls.fail("CFStringGetBytes", nth);
         EXPECT_THROW(stricmp("abc", "def"), XConversion) << nth;
+        EXPECT_EQ(TestSupport::liveObjects(), before + 1) << nth;
+        CFRelease(calls.of("CFStringGetBytes").back().object);
     }
-    expectLeaks(4);
 }
 
 Strings::string wideOf(std::u16string const& units) {
