@@ -1,10 +1,10 @@
-// A locale's name is language[_territory][.codeset][@modifier] (POSIX); the first of its variables
-// that is set and not empty counts. What the codeset names may be spelled with or without dashes
-// and in either case.
+// A locale's name is language[_territory][.codeset][@modifier] (POSIX). What the codeset names may
+// be spelled with or without dashes and in either case.
+
+#include "0Platform/CoreFoundation/_Imp/CFLocaleObject.h"
 
 #include <CoreFoundation/CFStringEncodingExt.h>
 
-#include <cstdlib>
 #include <cstring>
 #include <string>
 
@@ -52,15 +52,6 @@ constexpr Codeset codesets[] = {
     {"maccyrillic", kCFStringEncodingMacCyrillic},
 };
 
-char const* localeName() {
-    for (char const* const variable : {"LC_ALL", "LC_CTYPE", "LANG"}) {
-        char const* const value = std::getenv(variable);
-        if (value != nullptr && *value != '\0')
-            return value;
-    }
-    return "";
-}
-
 // The codeset's letters and digits, in lower case whatever the C locale is.
 std::string normalizedCodeset(char const* locale) {
     std::string codeset;
@@ -79,7 +70,7 @@ std::string normalizedCodeset(char const* locale) {
 } // namespace
 
 extern "C" CFStringEncoding CFStringGetSystemEncoding(void) {
-    std::string const codeset = normalizedCodeset(localeName());
+    std::string const codeset = normalizedCodeset(CFPlatform::environmentLocale());
     for (Codeset const& known : codesets) {
         if (codeset == known.name)
             return known.encoding;
