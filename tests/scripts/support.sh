@@ -43,9 +43,13 @@ try() {
   output=$("$@" 2>&1) || status=$?
 }
 
+expect_status() {
+  [ "$status" -eq "$1" ] || fail "ended with $status, not $1"
+}
+
 expect_success() {
   try "$@"
-  [ "$status" -eq 0 ] || fail "$* ended with $status"
+  expect_status 0
 }
 
 # expect_failure <status> <text> <command>...: the command ends so and says the text.
@@ -53,7 +57,7 @@ expect_failure() {
   local expected=$1 text=$2
   shift 2
   try "$@"
-  [ "$status" -eq "$expected" ] || fail "$* ended with $status, not $expected"
+  expect_status "$expected"
   expect_said "$text"
 }
 
@@ -67,6 +71,10 @@ expect_not_said() {
 
 expect_one_line() {
   [ "$(wc -l <<<"$output")" -eq 1 ] || fail "more than one line"
+}
+
+expect_last_line() {
+  [ "$(tail -n 1 <<<"$output")" = "$1" ] || fail "the last line is not: $1"
 }
 
 # add_file <path in the project>: writes the standard input there.
