@@ -2,7 +2,8 @@
 #
 # The target <name> compiles Java sources into the folder java/<name> of the build, which it owns.
 
-include_guard(GLOBAL)
+# Not GLOBAL: each folder that uses it needs the variable.
+include_guard()
 
 # In the "C" locale a Java machine loses every path that is not ASCII.
 set(QORN_JAVA_LOCALE LC_ALL=C.UTF-8)
