@@ -14,7 +14,7 @@ function(qorn_add_java name)
   set(classes ${PROJECT_BINARY_DIR}/java/${name})
   set(stamp ${CMAKE_CURRENT_BINARY_DIR}/${name}.stamp)
   add_custom_command(OUTPUT ${stamp}
-    COMMAND ${CMAKE_COMMAND} -E rm -rf ${classes}
+    COMMAND ${CMAKE_COMMAND} -E rm -rf ${classes} ${stamp}
     COMMAND ${CMAKE_COMMAND} -E make_directory ${classes}
     COMMAND ${CMAKE_COMMAND} -E env ${QORN_JAVA_LOCALE} ${Java_JAVAC_EXECUTABLE}
             --release 11 -encoding UTF-8 -Xlint:all -Werror -d ${classes} ${arg_SOURCES}
