@@ -28,7 +28,8 @@ FirstStepsInCpp() {
 }
 
 FirstStepsInJava() {
-  expect_success env LC_ALL=C.UTF-8 "$JAVA" -cp "$CLASSES" FirstSteps "$LIBRARY"
+  cd -- "$CLASSES"
+  expect_success env LC_ALL=C.UTF-8 "$JAVA" -cp . FirstSteps "$LIBRARY"
   [ "$output" = $'3\n0' ] || fail "not what the comments say"
 }
 

@@ -116,6 +116,13 @@ AMissingAptGetIsTold() {
   expect_one_line
 }
 
+APathThatCMakeCannotTakeIsTold() {
+  debian
+  mv -- "$project" "$work/a;b"
+  expect_failure 1 "CMake cannot build in a path that holds one of ; \" # \$ \\" "$work/a;b/run"
+  expect_one_line
+}
+
 AMissingJavaCompilerIsTold() {
   debian
   rm -- "$work/bin/javac"

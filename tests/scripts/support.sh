@@ -11,7 +11,7 @@ root=$(readlink -f -- "$(dirname -- "${BASH_SOURCE[0]}")/../..")
 work=$(mktemp -d)
 trap 'rm -rf -- "$work"' EXIT
 # What a script works on; the name has all that a path may spring on it.
-project="$work/a (clone) of Größe's 東京"
+project="$work/a (clone): Größe's, 東京"
 mkdir -- "$project"
 
 # A git hook that runs the tests must not lend them its repository.

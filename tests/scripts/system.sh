@@ -12,7 +12,7 @@ isolate_commands() {
   cp -r -- "$root/run" "$root/test" "$root/scripts" "$project/"
   mkdir -- "$work/bin"
   for tool in awk basename bash cat chmod cut dirname echo env false getent grep id ls mkdir mktemp \
-    nproc readlink rm sed sort tail tee touch true wc; do
+    mv nproc readlink rm sed sort tail tee touch true wc; do
     ln -s -- "$(type -P "$tool")" "$work/bin/$tool"
   done
   PATH=$work/bin
