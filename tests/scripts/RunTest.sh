@@ -46,7 +46,10 @@ TheListsAreRefreshedOnlyAfterAFailure() {
 echo "apt-get $*" >>"$WORK/calls"
 case " $* " in
   *" update "*) touch "$WORK/lists" ;;
-  *) [ -e "$WORK/lists" ] && echo ccache >>"$WORK/installed" ;;
+  *)
+    [ -e "$WORK/lists" ] || { echo "E: Unable to locate package ccache" >&2; exit 100; }
+    echo ccache >>"$WORK/installed"
+    ;;
 esac
 END
   expect_configured
@@ -82,8 +85,14 @@ ARefusalOfSudoIsGiven() {
   debian
   user 1000
   remove_package ccache
-  stub sudo <<<'echo "sudo: a password is required" >&2; exit 1'
+  stub sudo <<'END'
+echo "sudo" >>"$WORK/calls"
+echo "sudo: unable to resolve host" >&2
+echo "sudo: a password is required" >&2
+exit 1
+END
   expect_failure 1 "could not install ccache: sudo: a password is required" "$project/run"
+  expect_calls sudo
 }
 
 WithoutSudoAnOrdinaryUserIsTold() {
