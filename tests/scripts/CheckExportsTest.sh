@@ -53,7 +53,7 @@ ALibraryWithoutReadOnlyRelocationsFails() {
 }
 
 ALibraryThatIsBoundLateFails() {
-  library_with '' -Wl,-z,relro -Wl,-z,lazy
+  library_with '' -Wl,-z,relro -Wl,-z,lazy -Wl,-z,origin
   expect_failure 1 "BIND_NOW" "$root/scripts/check-exports" "$library"
 }
 

@@ -26,6 +26,7 @@ ItsDemandFails() { rejects "${S}ification demands it"; }
 ItsAuthorityFails() { rejects "as ${S}ified"; }
 ItsAuthorityInBriefFails() { rejects "four units, per $S"; }
 APlaceOfOneMachineFails() { rejects "look into ""/wo""rk/x"; }
+AThirdPlaceOfOneMachineFails() { rejects "look into ""/tmp/w""t-x"; }
 AnotherPlaceOfOneMachineFails() { rejects "look into ""/fa""rm/x"; }
 
 OrdinaryWordsPass() { accepts "The special part of 3 specifications, in parts; the spectrum."; }

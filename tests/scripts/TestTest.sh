@@ -25,6 +25,12 @@ AFailedTestFailsTheCommand() {
   expect_last_line "1 passed, 1 failed, 0 skipped"
 }
 
+AFailureThatOnlyCTestKnowsFailsTheCommand() {
+  built <<<$'add_test(one true)'
+  stub ctest <<<"'$ctest' \"\$@\"; exit 8"
+  expect_failure 8 "1 passed, 0 failed, 0 skipped" "$project/test"
+}
+
 ASkippedTestDoesNot() {
   built <<'END'
 add_test(one true)
