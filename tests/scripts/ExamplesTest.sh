@@ -29,7 +29,7 @@ FirstStepsInCpp() {
 
 FirstStepsInJava() {
   cd -- "$CLASSES"
-  expect_success env LC_ALL=C.UTF-8 "$JAVA" -cp . FirstSteps "$LIBRARY"
+  expect_success env -i LC_ALL=C.UTF-8 "$JAVA" -cp . FirstSteps "$LIBRARY"
   [ "$output" = $'3\n0' ] || fail "not what the comments say"
 }
 
