@@ -29,6 +29,10 @@ APlaceOfOneMachineFails() { rejects "look into ""/wo""rk/x"; }
 AThirdPlaceOfOneMachineFails() { rejects "look into ""/tmp/w""t-x"; }
 AnotherPlaceOfOneMachineFails() { rejects "look into ""/fa""rm/x"; }
 
+AFolderOfTheSameNameElsewherePasses() {
+  accepts "/srv/wo""rk/x, \${root}/wo""rk/x, a/fa""rm/x"
+}
+
 OrdinaryWordsPass() { accepts "The special part of 3 specifications, in parts; the spectrum."; }
 
 AnUntrackedFileIsSearched() {

@@ -73,6 +73,25 @@ APresetAndVariablesGoToCMake() {
     fail "called: $(cat "$work/calls")"
 }
 
+AnotherCompilerIsConfiguredAnew() {
+  debian
+  printf '%s\n' clang libclang-rt-14-dev >>"$work/installed"
+  stub java </dev/null
+  stub clang++ </dev/null
+  stub cmake <<<'echo "cmake $*"; exit 1'
+  add_file build/asan/CMakeCache.txt <<END
+CMAKE_HOME_DIRECTORY:INTERNAL=$project
+Java_JAVA_EXECUTABLE:FILEPATH=$work/bin/java
+CMAKE_CXX_COMPILER:FILEPATH=/usr/bin/g++
+END
+  expect_failure 1 "cmake --fresh --preset asan" "$project/test" asan -DCMAKE_CXX_COMPILER=clang++
+  expect_failure 1 "cmake --preset asan" "$project/test" asan
+  sed -i "s,/usr/bin/g++,$work/bin/clang++," "$project/build/asan/CMakeCache.txt"
+  expect_failure 1 "cmake --preset asan" "$project/test" asan -DCMAKE_CXX_COMPILER=clang++
+  sed -i "s,$work/bin/clang++,clang++," "$project/build/asan/CMakeCache.txt"
+  expect_failure 1 "cmake --preset asan" "$project/test" asan -DCMAKE_CXX_COMPILER=clang++
+}
+
 AnythingElseIsAUsageError() {
   debian
   local argument
