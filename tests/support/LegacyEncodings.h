@@ -5,7 +5,6 @@
 #ifndef QORN_TESTS_LEGACYENCODINGS_H
 #define QORN_TESTS_LEGACYENCODINGS_H
 
-#include <CoreFoundation/CFStringEncodingExt.h>
 #include <CoreFoundation/CoreFoundation.h>
 
 #include <optional>
