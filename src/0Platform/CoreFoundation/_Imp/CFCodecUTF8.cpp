@@ -1,64 +1,24 @@
-// UTF-8 (RFC 3629), read strictly: overlong forms, surrogates, values above 10FFFF and sequences
-// that are cut off fail. One leading byte order mark is removed.
-
-#include "0Platform/CoreFoundation/_Imp/CFCodec.h"
+#include "0Platform/CoreFoundation/_Imp/CFCodecUTF8.h"
 #include "0Platform/CoreFoundation/_Imp/CFUnicode.h"
 
-#include <cstdint>
+#include <algorithm>
 #include <cstring>
 
 namespace CFPlatform {
 namespace {
 
-constexpr CFIndex asciiBlock = 16;
 // Up to here a unit for each byte is cheaper than counting first.
 constexpr CFIndex uncountedBytes = 512;
+// Whole blocks, and no more than cannot overflow a count that is itself a byte.
+constexpr CFIndex countedAtOnce = 112;
 
-bool isContinuation(UInt8 byte) {
-    return (byte & 0xC0) == 0x80;
-}
-
-bool isAsciiBlock(UInt8 const* bytes) {
-    std::uint64_t low;
-    std::uint64_t high;
-    std::memcpy(&low, bytes, 8);
-    std::memcpy(&high, bytes + 8, 8);
-    return ((low | high) & 0x8080808080808080U) == 0;
-}
-
-void widenAsciiBlock(UInt8 const* bytes, UniChar* units) {
-    for (CFIndex i = 0; i < asciiBlock; ++i)
-        units[i] = bytes[i];
-}
-
-// Reads the sequence at `bytes`. Returns its length, or 0 where it is malformed.
-CFIndex readSequence(UInt8 const* bytes, UInt8 const* end, UInt32& codePoint) {
-    UInt8 const lead = bytes[0];
-    CFIndex const left = end - bytes;
-    if (lead < 0x80) {
-        codePoint = lead;
-        return 1;
-    }
-    if (lead < 0xC2)
-        return 0;
-    if (lead < 0xE0) {
-        if (left < 2 || !isContinuation(bytes[1]))
-            return 0;
-        codePoint = (lead & 0x1FU) << 6 | (bytes[1] & 0x3FU);
-        return 2;
-    }
-    if (lead < 0xF0) {
-        if (left < 3 || !isContinuation(bytes[1]) || !isContinuation(bytes[2]))
-            return 0;
-        codePoint = (lead & 0x0FU) << 12 | (bytes[1] & 0x3FU) << 6 | (bytes[2] & 0x3FU);
-        return codePoint < 0x800U || isSurrogate(codePoint) ? 0 : 3;
-    }
-    if (lead > 0xF4 || left < 4 || !isContinuation(bytes[1]) || !isContinuation(bytes[2]) ||
-        !isContinuation(bytes[3]))
-        return 0;
-    codePoint = (lead & 0x07U) << 18 | (bytes[1] & 0x3FU) << 12 | (bytes[2] & 0x3FU) << 6 |
-                (bytes[3] & 0x3FU);
-    return codePoint < 0x10000U || codePoint > 0x10FFFFU ? 0 : 4;
+// The units of at most `countedAtOnce` bytes: one for each lead, two for one of four bytes. The
+// count is a byte so that the compiler's loop takes sixteen of them at a time.
+CFIndex unitsOf(UInt8 const* bytes, CFIndex count) {
+    UInt8 units = 0;
+    for (CFIndex i = 0; i < count; ++i)
+        units = static_cast<UInt8>(units + ((bytes[i] & 0xC0) != 0x80) + (bytes[i] >= 0xF0));
+    return units;
 }
 
 CFIndex sequenceLength(UInt32 codePoint) {
@@ -76,34 +36,16 @@ class CodecUTF8 final : public Codec {
   public:
     CFIndex maximumUnits(UInt8 const* bytes, CFIndex count) const noexcept override {
         if (count <= uncountedBytes)
-            return count;
-        CFIndex units = 0;
-        for (CFIndex i = 0; i < count; ++i)
-            units += static_cast<CFIndex>(!isContinuation(bytes[i])) +
-                     static_cast<CFIndex>(bytes[i] >= 0xF0);
+            return count + unitsBeyondUTF8;
+        CFIndex units = unitsBeyondUTF8;
+        for (CFIndex i = 0; i < count; i += countedAtOnce)
+            units += unitsOf(bytes + i, std::min(countedAtOnce, count - i));
         return units;
     }
 
     CFIndex decode(UInt8 const* bytes, CFIndex count, UniChar* units) const noexcept override {
-        UInt8 const* const end = bytes + count;
-        UniChar* out = units;
-        if (count >= 3 && std::memcmp(bytes, "\xEF\xBB\xBF", 3) == 0)
-            bytes += 3;
-        while (bytes != end) {
-            if (end - bytes >= asciiBlock && isAsciiBlock(bytes)) {
-                widenAsciiBlock(bytes, out);
-                bytes += asciiBlock;
-                out += asciiBlock;
-                continue;
-            }
-            UInt32 codePoint;
-            CFIndex const length = readSequence(bytes, end, codePoint);
-            if (length == 0)
-                return -1;
-            out += putCodePoint(out, codePoint);
-            bytes += length;
-        }
-        return out - units;
+        bool const hasMark = count >= 3 && std::memcmp(bytes, "\xEF\xBB\xBF", 3) == 0;
+        return hasMark ? readUTF8(bytes + 3, count - 3, units) : readUTF8(bytes, count, units);
     }
 
     // The loss byte has no say: what UTF-8 can't show is only an unpaired surrogate, and there the
