@@ -1,5 +1,4 @@
 #include "0Platform/CoreFoundation/_Imp/CFCodecUTF8.h"
-#include "0Platform/CoreFoundation/_Imp/CFUnicode.h"
 
 #include <algorithm>
 #include <cstring>
@@ -21,17 +20,6 @@ CFIndex unitsOf(UInt8 const* bytes, CFIndex count) {
     return units;
 }
 
-CFIndex sequenceLength(UInt32 codePoint) {
-    return codePoint < 0x80U ? 1 : codePoint < 0x800U ? 2 : codePoint < 0x10000U ? 3 : 4;
-}
-
-void writeSequence(UInt8* bytes, UInt32 codePoint, CFIndex length) {
-    static constexpr UInt8 leads[] = {0, 0, 0xC0, 0xE0, 0xF0};
-    for (CFIndex i = length - 1; i > 0; --i, codePoint >>= 6)
-        bytes[i] = static_cast<UInt8>(0x80U | (codePoint & 0x3FU));
-    bytes[0] = static_cast<UInt8>(leads[length] | codePoint);
-}
-
 class CodecUTF8 final : public Codec {
   public:
     CFIndex maximumUnits(UInt8 const* bytes, CFIndex count) const noexcept override {
@@ -51,23 +39,8 @@ class CodecUTF8 final : public Codec {
     // The loss byte has no say: what UTF-8 can't show is only an unpaired surrogate, and there the
     // conversion stops.
     Encoded encode(EncodeRequest const& request) const noexcept override {
-        Encoded done = {0, 0};
-        while (done.units < request.count) {
-            UniChar const* const units = request.units + done.units;
-            bool const pair = isPairAt(request.units, request.count, done.units);
-            UInt32 const codePoint = pair ? joinPair(units[0], units[1]) : units[0];
-            CFIndex const length = sequenceLength(codePoint);
-            if (!pair && isSurrogate(codePoint))
-                break;
-            if (request.buffer != nullptr) {
-                if (length > request.room - done.bytes)
-                    break;
-                writeSequence(request.buffer + done.bytes, codePoint, length);
-            }
-            done.units += pair ? 2 : 1;
-            done.bytes += length;
-        }
-        return done;
+        return request.buffer == nullptr ? measureUTF8(request.units, request.count)
+                                         : writeUTF8(request);
     }
 };
 

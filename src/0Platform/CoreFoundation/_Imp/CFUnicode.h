@@ -23,6 +23,14 @@ inline bool isPairAt(UniChar const* units, CFIndex count, CFIndex index) {
     return isHighSurrogate(units[index]) && index + 1 < count && isLowSurrogate(units[index + 1]);
 }
 
+/// How many units stand in front of the first unpaired surrogate; all where there is none.
+inline CFIndex pairedFront(UniChar const* units, CFIndex count) {
+    CFIndex index = 0;
+    while (index < count && (isPairAt(units, count, index) || !isSurrogate(units[index])))
+        index += isSurrogate(units[index]) ? 2 : 1;
+    return index;
+}
+
 inline UInt32 joinPair(UniChar high, UniChar low) {
     return 0x10000U + ((high - 0xD800U) << 10) + (low - 0xDC00U);
 }

@@ -14,6 +14,8 @@
 
 namespace CFPlatform {
 
+static_assert(__BYTE_ORDER__ == __ORDER_LITTLE_ENDIAN__, "lanes are also told apart by shifting");
+
 typedef UInt8 Bytes8 __attribute__((vector_size(8)));
 typedef UInt16 Units4 __attribute__((vector_size(8)));
 typedef UInt16 Units8 __attribute__((vector_size(16)));
@@ -32,6 +34,32 @@ inline void store(void* memory, TValue const& value) {
     std::memcpy(memory, &value, sizeof(value));
 }
 
+/// Eight bytes as units, four units as words, and the other way round: the half of each of eight
+/// words that makes a unit, and the half that does not.
+inline Units8 widen(std::uint64_t bytes) {
+    return __builtin_convertvector(load<Bytes8>(&bytes), Units8);
+}
+
+inline Words4 widenFront(Units8 units) {
+    Units8 const words = __builtin_shufflevector(units, Units8{}, 0, 8, 1, 9, 2, 10, 3, 11);
+    return reinterpret_cast<Words4>(words);
+}
+
+inline Words4 widenBack(Units8 units) {
+    Units8 const words = __builtin_shufflevector(units, Units8{}, 4, 12, 5, 13, 6, 14, 7, 15);
+    return reinterpret_cast<Words4>(words);
+}
+
+inline Units8 lowHalves(Words4 front, Words4 back) {
+    return __builtin_shufflevector(reinterpret_cast<Units8>(front), reinterpret_cast<Units8>(back),
+                                   0, 2, 4, 6, 8, 10, 12, 14);
+}
+
+inline Units8 highHalves(Words4 front, Words4 back) {
+    return __builtin_shufflevector(reinterpret_cast<Units8>(front), reinterpret_cast<Units8>(back),
+                                   1, 3, 5, 7, 9, 11, 13, 15);
+}
+
 /// Marks, all ones, in the lanes that are not zero and that are.
 inline Units8 nonZero(Units8 block) {
     return reinterpret_cast<Units8>(block != 0);
@@ -45,21 +73,41 @@ inline Words4 nonZero(Words4 block) {
     return reinterpret_cast<Words4>(block != 0);
 }
 
-/// Marks where a unit is half of a surrogate pair.
+/// Marks where a unit is half of a surrogate pair, the front half, the back half.
 inline Units8 surrogates(Units8 units) {
     return zero((units & 0xF800) ^ 0xD800);
 }
 
-/// How many bytes stand in front of the first one whose top bit is set.
-inline CFIndex clearBytes(std::uint64_t bytes) {
-    std::uint64_t const tops = bytes & 0x8080808080808080U;
+inline Units8 highSurrogates(Units8 units) {
+    return zero((units & 0xFC00) ^ 0xD800);
+}
+
+inline Units8 lowSurrogates(Units8 units) {
+    return zero((units & 0xFC00) ^ 0xDC00);
+}
+
+/// One byte for each lane, with its top bit set where the lane is not zero.
+inline std::uint64_t topBits(Units8 block) {
+    auto const marks = __builtin_convertvector(nonZero(block), Bytes8);
+    return load<std::uint64_t>(&marks) & 0x8080808080808080U;
+}
+
+/// How many of eight bytes stand in front of the first one whose top bit is set.
+inline CFIndex clearBytes(std::uint64_t tops) {
     return tops == 0 ? 8 : __builtin_ctzll(tops) / 8;
+}
+
+/// The same for sixteen, of which at least one is marked. In mixed text it is anyone's guess where
+/// that is, so this does not branch.
+inline CFIndex clearBytes(std::uint64_t frontTops, std::uint64_t backTops) {
+    std::uint64_t const frontIsClear = 0U - static_cast<std::uint64_t>(frontTops == 0);
+    std::uint64_t const tops = frontTops | (backTops & frontIsClear);
+    return static_cast<CFIndex>(8 & frontIsClear) + __builtin_ctzll(tops) / 8;
 }
 
 /// How many lanes stand in front of the first one that is not zero.
 inline CFIndex clearLanes(Units8 block) {
-    auto const marks = __builtin_convertvector(nonZero(block), Bytes8);
-    return clearBytes(load<std::uint64_t>(&marks));
+    return clearBytes(topBits(block));
 }
 
 inline CFIndex clearLanes(Words4 block) {
@@ -67,9 +115,47 @@ inline CFIndex clearLanes(Words4 block) {
     return clearBytes(load<std::uint64_t>(&marks)) / 2;
 }
 
+/// The sum of all lanes, which must not be above FFFF.
+inline CFIndex sumOf(Units8 block) {
+    auto const front = load<std::uint64_t>(&block);
+    auto const back = load<std::uint64_t>(reinterpret_cast<char const*>(&block) + 8);
+    // The product's highest lane is the sum of all four.
+    return static_cast<CFIndex>((front + back) * 0x0001000100010001U >> 48);
+}
+
+/// Marks in the last `count` lanes.
+inline Units8 lastLanes(CFIndex count) {
+    Units8 const fromTheEnd = {8, 7, 6, 5, 4, 3, 2, 1};
+    return reinterpret_cast<Units8>(fromTheEnd <= static_cast<UInt16>(count));
+}
+
+/// Goes through `count` units block by block: `add` receives where a block begins, and marks for
+/// the lanes that count, since the last block begins with units of the one before. Returns how
+/// many units are left at the end: none, or all where they are too few for a block.
+template <class TAdd>
+inline CFIndex forEachBlock(UniChar const* units, CFIndex count, TAdd const& add) {
+    if (count < 8)
+        return count;
+    CFIndex index = 0;
+    for (; count - index >= 8; index += 8)
+        add(units + index, lastLanes(8));
+    if (index < count)
+        add(units + count - 8, lastLanes(count - index));
+    return 0;
+}
+
 /// Surrogate pairs, the high half in front, of code points less 10000.
 inline Words4 splitPairs(Words4 beyond) {
     return 0xDC00D800U + (beyond >> 10) + ((beyond & 0x3FF) << 16);
+}
+
+/// The code points of surrogate pairs, and what is not zero where a word is no pair.
+inline Words4 joinPairs(Words4 pairs) {
+    return 0x10000 + ((pairs & 0x3FF) << 10) + (pairs >> 16 & 0x3FF);
+}
+
+inline Words4 wrongPairs(Words4 pairs) {
+    return (pairs & 0xFC00FC00U) ^ 0xDC00D800U;
 }
 
 } // namespace CFPlatform
