@@ -1,108 +1,146 @@
 // UTF-32 in host order. Reading is strict, but for bytes behind the last whole element, which are
 // ignored; an unpaired surrogate is written as the loss byte.
+//
+// Both directions go one character after another. Neighbours mostly take the same number of units,
+// so each number has a road that takes a run of its characters in blocks; a road ends before what
+// is of another kind, and before the last few characters.
 
-#include "0Platform/CoreFoundation/_Imp/CFCodec.h"
+#include "0Platform/CoreFoundation/_Imp/CFVector.h"
+#include "0Platform/CoreFoundation/_Imp/CFCursor.h"
 #include "0Platform/CoreFoundation/_Imp/CFUnicode.h"
 
 #include <algorithm>
-#include <cstring>
 
 namespace CFPlatform {
 namespace {
 
-constexpr CFIndex blockSize = 16;
+// Reading stores up to this many units beyond those that count.
+constexpr CFIndex unitsBeyond = 8;
 
-UInt32 loadElement(UInt8 const* bytes) {
-    UInt32 value;
-    std::memcpy(&value, bytes, sizeof(value));
-    return value;
-}
+class Reader : private DecodeCursor {
+  public:
+    using DecodeCursor::DecodeCursor;
+    using DecodeCursor::written;
 
-void storeElement(UInt8* bytes, UInt32 value) {
-    std::memcpy(bytes, &value, sizeof(value));
-}
-
-// Narrows one block if each element is a single unit and no surrogate.
-bool decodeBlock(UInt8 const* bytes, UniChar* units) {
-    UInt32 bad = 0;
-    for (CFIndex i = 0; i < blockSize; ++i) {
-        UInt32 const value = loadElement(bytes + 4 * i);
-        bad |= static_cast<UInt32>(value > 0xFFFFU) | static_cast<UInt32>(isSurrogate(value));
-        units[i] = static_cast<UniChar>(value);
+    bool readAll() {
+        readOnes();
+        for (; bytes != end; readOnes()) {
+            auto const element = load<UInt32>(bytes);
+            if (element > 0x10FFFFU || isSurrogate(element))
+                return false;
+            advance(4, putCodePoint(units, element));
+            readPairs();
+        }
+        return true;
     }
-    return bad == 0;
+
+  private:
+    void readOnes() {
+        for (CFIndex good = 8; good == 8 && has(32); advance(4 * good, good)) {
+            auto const front = load<Words4>(bytes);
+            auto const back = load<Words4>(bytes + 16);
+            Units8 const block = lowHalves(front, back);
+            store(units, block);
+            good = clearLanes(highHalves(front, back) | surrogates(block));
+        }
+    }
+
+    void readPairs() {
+        for (CFIndex good = 4; good == 4 && has(16) && load<UInt32>(bytes) > 0xFFFFU;
+             advance(4 * good, 2 * good)) {
+            Words4 const beyond = load<Words4>(bytes) - 0x10000;
+            store(units, splitPairs(beyond));
+            good = clearLanes(beyond >> 20);
+        }
+    }
+};
+
+class Writer : private EncodeCursor {
+  public:
+    using EncodeCursor::done;
+    using EncodeCursor::EncodeCursor;
+
+    void writeAll(UInt8 lossByte) {
+        writeOnes();
+        for (; has(1, 4); writeOnes()) {
+            bool const pair = isPairAt(units, end - units, 0);
+            UInt32 element = pair ? joinPair(units[0], units[1]) : units[0];
+            if (isSurrogate(element)) {
+                if (lossByte == 0)
+                    return;
+                element = lossByte;
+            }
+            store(bytes, element);
+            advance(pair ? 2 : 1, 4);
+            writePairs();
+        }
+    }
+
+  private:
+    void writeOnes() {
+        for (CFIndex good = 8; good == 8 && has(8, 32); advance(good, 4 * good)) {
+            auto const block = load<Units8>(units);
+            store(bytes, widenFront(block));
+            store(bytes + 16, widenBack(block));
+            good = clearLanes(surrogates(block));
+        }
+    }
+
+    void writePairs() {
+        for (CFIndex good = 4; good == 4 && has(8, 16) && isHighSurrogate(units[0]);
+             advance(2 * good, 4 * good)) {
+            auto const pairs = load<Words4>(units);
+            store(bytes, joinPairs(pairs));
+            good = clearLanes(wrongPairs(pairs));
+        }
+    }
+};
+
+// No more units than cannot overflow a count of 16 bits.
+constexpr CFIndex countedAtOnce = 32768;
+
+// The pairs that end in one of at most `countedAtOnce` units, in front of which one more stands.
+CFIndex countPairs(UniChar const* units, CFIndex count) {
+    Units8 pairs = {};
+    CFIndex const left = forEachBlock(units, count, [&](UniChar const* block, Units8 counting) {
+        // Taking away a mark adds one.
+        pairs -=
+            highSurrogates(load<Units8>(block - 1)) & lowSurrogates(load<Units8>(block)) & counting;
+    });
+    CFIndex result = sumOf(pairs);
+    for (CFIndex i = count - left; i < count; ++i)
+        result += isHighSurrogate(units[i - 1]) && isLowSurrogate(units[i]);
+    return result;
 }
 
-// True where no unit of the block is a surrogate.
-bool isPlainBlock(UniChar const* units) {
-    UInt32 bad = 0;
-    for (CFIndex i = 0; i < blockSize; ++i)
-        bad |= static_cast<UInt32>(isSurrogate(units[i]));
-    return bad == 0;
-}
-
-void encodeBlock(UniChar const* units, UInt8* bytes) {
-    for (CFIndex i = 0; i < blockSize; ++i)
-        storeElement(bytes + 4 * i, units[i]);
+// What writeAll would write with room for all: an element for each unit, but one for a pair.
+Encoded measure(UniChar const* units, CFIndex count, UInt8 lossByte) {
+    CFIndex const reached = lossByte != 0 ? count : pairedFront(units, count);
+    CFIndex elements = reached;
+    for (CFIndex i = 1; i < reached; i += countedAtOnce)
+        elements -= countPairs(units + i, std::min(countedAtOnce, reached - i));
+    return {reached, 4 * elements};
 }
 
 class CodecUTF32 final : public Codec {
   public:
     CFIndex maximumUnits(UInt8 const*, CFIndex count) const noexcept override {
-        // Two units an element, rounded up to whole blocks, which are stored before they are
-        // judged.
-        return count / 2 + blockSize;
+        return count / 2 + unitsBeyond;
     }
 
     CFIndex decode(UInt8 const* bytes, CFIndex count, UniChar* units) const noexcept override {
         if (count > 0 && count < 4)
             return -1;
-        UInt8 const* const end = bytes + count / 4 * 4;
-        UniChar* out = units;
-        while (bytes != end) {
-            if (end - bytes >= 4 * blockSize && decodeBlock(bytes, out)) {
-                bytes += 4 * blockSize;
-                out += blockSize;
-                continue;
-            }
-            UInt8 const* const stop = std::min(end, bytes + 4 * blockSize);
-            for (; bytes != stop; bytes += 4) {
-                UInt32 const value = loadElement(bytes);
-                if (isSurrogate(value) || value > 0x10FFFFU)
-                    return -1;
-                out += putCodePoint(out, value);
-            }
-        }
-        return out - units;
+        Reader reader(bytes, count / 4 * 4, units);
+        return reader.readAll() ? reader.written() : -1;
     }
 
     Encoded encode(EncodeRequest const& request) const noexcept override {
-        CFIndex const limit = request.buffer == nullptr ? request.count : request.room / 4;
-        CFIndex unit = 0;
-        CFIndex elements = 0;
-        while (unit < request.count && elements < limit) {
-            UniChar const* const units = request.units + unit;
-            if (request.count - unit >= blockSize && limit - elements >= blockSize &&
-                isPlainBlock(units)) {
-                if (request.buffer != nullptr)
-                    encodeBlock(units, request.buffer + 4 * elements);
-                unit += blockSize;
-                elements += blockSize;
-                continue;
-            }
-            bool const pair = isPairAt(request.units, request.count, unit);
-            UInt32 value = pair ? joinPair(units[0], units[1]) : units[0];
-            if (!pair && isSurrogate(value)) {
-                if (request.lossByte == 0)
-                    break;
-                value = request.lossByte;
-            }
-            if (request.buffer != nullptr)
-                storeElement(request.buffer + 4 * elements, value);
-            unit += pair ? 2 : 1;
-            ++elements;
-        }
-        return {unit, elements * 4};
+        if (request.buffer == nullptr)
+            return measure(request.units, request.count, request.lossByte);
+        Writer writer(request);
+        writer.writeAll(request.lossByte);
+        return writer.done();
     }
 };
 
