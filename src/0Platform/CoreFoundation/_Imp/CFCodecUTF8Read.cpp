@@ -48,24 +48,28 @@ class Reader : private DecodeCursor {
     // road that takes a run of its sequences in blocks. A road ends before what is of another
     // length or malformed, and before the last few bytes of the text.
     bool readAll() {
-        readOnesAndTwos();
-        while (bytes != end) {
+        for (readRun(); bytes != end; readRun()) {
             UInt32 codePoint;
             CFIndex const length = readSequence(bytes, end - bytes, codePoint);
             if (length == 0)
                 return false;
             advance(length, putCodePoint(units, codePoint));
-            if (length == 3)
-                readThrees();
-            else if (length == 4)
-                readFours();
-            else
-                readOnesAndTwos();
         }
         return true;
     }
 
   private:
+    void readRun() {
+        if (!has(8))
+            return;
+        if (bytes[0] < 0xE0)
+            readOnesAndTwos();
+        else if (bytes[0] < 0xF0)
+            readThrees();
+        else
+            readFours();
+    }
+
     // True where a block of `count` bytes is left and a run goes on: its sequences begin with
     // `lead` or more. The third one is asked as well, since a block costs as much as two single
     // sequences.

@@ -29,8 +29,7 @@ class Writer : private EncodeCursor {
     // characters in blocks. A road ends before what is of another length, and before the last few
     // units of the text and bytes of the room.
     void writeAll() {
-        writeOnesAndTwos();
-        while (units != end) {
+        for (writeRun(); units != end; writeRun()) {
             bool const pair = isPairAt(units, end - units, 0);
             UInt32 const codePoint = pair ? joinPair(units[0], units[1]) : units[0];
             CFIndex const length = sequenceLength(codePoint);
@@ -38,16 +37,21 @@ class Writer : private EncodeCursor {
                 return;
             writeSequence(bytes, codePoint, length);
             advance(pair ? 2 : 1, length);
-            if (length == 3)
-                writeThrees();
-            else if (length == 4)
-                writeFours();
-            else
-                writeOnesAndTwos();
         }
     }
 
   private:
+    void writeRun() {
+        if (!has(8, 16))
+            return;
+        if (units[0] < 0x800)
+            writeOnesAndTwos();
+        else if (isSurrogate(units[0]))
+            writeFours();
+        else
+            writeThrees();
+    }
+
     void writeOnes() {
         while (has(16, 16)) {
             auto const low = load<Units8>(units);
@@ -82,13 +86,15 @@ class Writer : private EncodeCursor {
     }
 
     void writeThrees() {
-        // The last triple is stored as four bytes.
-        for (CFIndex good = 8; good == 8 && has(8, 25) && startsRun(0x800);
+        for (CFIndex good = 8; good == 8 && has(8, 24) && startsRun(0x800);
              advance(good, 3 * good)) {
             auto const block = load<Units8>(units);
             Words4 const triples[2] = {triplesOf(widenFront(block)), triplesOf(widenBack(block))};
-            for (int i = 0; i < 8; ++i)
+            for (int i = 0; i < 7; ++i)
                 store(bytes + 3 * i, triples[i / 4][i % 4]);
+            // A fourth byte here would be one too many.
+            store(bytes + 21, static_cast<UInt16>(triples[1][3]));
+            bytes[23] = static_cast<UInt8>(triples[1][3] >> 16);
             good = clearLanes(zero(block & 0xF800) | surrogates(block));
         }
     }
