@@ -39,6 +39,8 @@ CFIndex readSequence(UInt8 const* bytes, CFIndex left, UInt32& codePoint) {
     return codePoint < 0x10000U || codePoint > 0x10FFFFU ? 0 : 4;
 }
 
+constexpr std::uint64_t everyByte = 0x0101010101010101U;
+
 class Reader : private DecodeCursor {
   public:
     using DecodeCursor::DecodeCursor;
@@ -48,14 +50,16 @@ class Reader : private DecodeCursor {
     // road that takes a run of its sequences in blocks. A road ends before what is of another
     // length or malformed, and before the last few bytes of the text.
     bool readAll() {
-        for (readRun(); bytes != end; readRun()) {
+        for (;;) {
+            readRun();
+            if (bytes == end)
+                return true;
             UInt32 codePoint;
             CFIndex const length = readSequence(bytes, end - bytes, codePoint);
             if (length == 0)
                 return false;
             advance(length, putCodePoint(units, codePoint));
         }
-        return true;
     }
 
   private:
@@ -99,17 +103,17 @@ class Reader : private DecodeCursor {
                 return;
             Units8 const now = widen(eight);
             Units8 const before = widen(eight << 8);
-            Units8 const continuations = zero((now & 0xC0) ^ 0x80);
-            Units8 const leadsBefore = zero((before & 0xE0) ^ 0xC0);
+            Units8 const seconds = zero((now & 0xC0) ^ 0x80);
+            Units8 const firsts = zero((before & 0xE0) ^ 0xC0);
             Units8 const overlong = zero((before & 0xFE) ^ 0xC0);
-            if (clearLanes((continuations ^ leadsBefore) | overlong) < 8)
+            if (clearLanes((seconds ^ firsts) | overlong) < 8)
                 return;
             Units8 const joined = (before & 0x1F) << 6 | (now & 0x3F);
-            Units8 const block = (now & ~continuations) | (joined & continuations);
+            Units8 const block = (now & ~seconds) | (joined & seconds);
             // Byte by byte, how many units stand up to and with this one: the product adds up the
             // bytes that are no lead.
-            std::uint64_t const leads = eight >> 7 & eight >> 6 & 0x0101010101010101U;
-            std::uint64_t const counts = (leads ^ 0x0101010101010101U) * 0x0101010101010101U;
+            std::uint64_t const leads = eight >> 7 & eight >> 6 & everyByte;
+            std::uint64_t const counts = (leads ^ everyByte) * everyByte;
             store(units, block[0]);
             for (int i = 1; i < 8; ++i)
                 store(units + (counts >> (8 * i - 8) & 0xFF), block[i]);

@@ -29,7 +29,10 @@ class Writer : private EncodeCursor {
     // characters in blocks. A road ends before what is of another length, and before the last few
     // units of the text and bytes of the room.
     void writeAll() {
-        for (writeRun(); units != end; writeRun()) {
+        for (;;) {
+            writeRun();
+            if (units == end)
+                return;
             bool const pair = isPairAt(units, end - units, 0);
             UInt32 const codePoint = pair ? joinPair(units[0], units[1]) : units[0];
             CFIndex const length = sequenceLength(codePoint);
