@@ -500,11 +500,11 @@ INSTANTIATE_TEST_SUITE_P(AllForms, CFEncoderTest,
 
 TEST_P(CFEncoderTest, TheTwinsWriteAlikeIntoEveryRoom) {
     for (std::size_t length = 1; length <= shortLengths; ++length)
-        forTextsOf(length, 4, [this](TUnits const& units) {
+        forTextsOf(length, 4, [&](TUnits const& units) {
             CPlatformString const string(units);
             std::size_t const limit = units.size() * 4 + 4;
             for (std::size_t room = 0; room <= limit; ++room)
-                for (UInt8 const lossByte : {'?', '\0'}) {
+                for (UInt8 const lossByte : {UInt8{'?'}, UInt8{0}}) {
                     CEncoded const expected = encodeSlowly(units, GetParam(), lossByte, room);
                     CEncoded const done = string.encode(wholeOf(units), GetParam(), lossByte, room,
                                                         room % alignments);
@@ -516,9 +516,9 @@ TEST_P(CFEncoderTest, TheTwinsWriteAlikeIntoEveryRoom) {
 
 TEST_P(CFEncoderTest, TheTwinsMeasureAlike) {
     for (std::size_t length = 1; length <= 3 * shortLengths; ++length)
-        forTextsOf(length, 10, [this](TUnits const& units) {
+        forTextsOf(length, 10, [&](TUnits const& units) {
             CPlatformString const string(units);
-            for (UInt8 const lossByte : {'?', '\0'}) {
+            for (UInt8 const lossByte : {UInt8{'?'}, UInt8{0}}) {
                 CEncoded const expected =
                     encodeSlowly(units, GetParam(), lossByte, units.size() * 4);
                 CEncoded const done = string.measure(wholeOf(units), GetParam(), lossByte);
@@ -531,7 +531,7 @@ TEST_P(CFEncoderTest, TheTwinsMeasureAlike) {
 // A range that begins or ends inside a pair sees half of it, whatever stands beyond.
 TEST_P(CFEncoderTest, TheTwinsAgreeOnBothSidesOfEverySplit) {
     for (std::size_t length = 1; length <= shortLengths; ++length)
-        forTextsOf(length, 2, [this](TUnits const& units) {
+        forTextsOf(length, 2, [&](TUnits const& units) {
             CPlatformString const string(units);
             for (std::size_t split = 0; split <= units.size(); ++split) {
                 auto const middle = units.begin() + static_cast<std::ptrdiff_t>(split);
