@@ -528,6 +528,39 @@ TEST_P(CFEncoderTest, TheTwinsMeasureAlike) {
         });
 }
 
+// Long stretches of letters, which are measured faster, with other text at every place around them.
+TEST_P(CFEncoderTest, TheTwinsMeasureLongTextAlike) {
+    for (std::size_t length = 1; length < 2000; length += 1 + random_.below(3)) {
+        TUnits units = utf16Of(random_.codePoints(random_.below(8)));
+        units.resize(units.size() + length, 'a');
+        TUnits const end = utf16Of(random_.codePoints(random_.below(40)));
+        units.insert(units.end(), end.begin(), end.end());
+        if (random_.below(2) == 0)
+            random_.damage(units);
+        CPlatformString const string(units);
+        CEncoded const expected = encodeSlowly(units, GetParam(), '?', units.size() * 4);
+        CEncoded const done = string.measure(wholeOf(units), GetParam(), '?');
+        ASSERT_EQ(done.units, expected.units);
+        ASSERT_EQ(done.bytes.size(), expected.bytes.size());
+    }
+}
+
+TEST_P(CFEncoderTest, AnUnpairedSurrogateIsMeasuredAtEveryPlace) {
+    for (UniChar const filler : {u'a', u'\u4E2D'}) {
+        for (UniChar const surrogate : {u'\xD83D', u'\xDE00'}) {
+            for (std::size_t place = 0; place < 1200; ++place) {
+                TUnits units(1200, filler);
+                units[place] = surrogate;
+                CEncoded const done =
+                    CPlatformString(units).measure(wholeOf(units), GetParam(), '\0');
+                CEncoded const expected = encodeSlowly(units, GetParam(), '\0', units.size() * 4);
+                ASSERT_EQ(done.units, expected.units) << "place " << place;
+                ASSERT_EQ(done.bytes.size(), expected.bytes.size()) << "place " << place;
+            }
+        }
+    }
+}
+
 // A range that begins or ends inside a pair sees half of it, whatever stands beyond.
 TEST_P(CFEncoderTest, TheTwinsAgreeOnBothSidesOfEverySplit) {
     for (std::size_t length = 1; length <= shortLengths; ++length)

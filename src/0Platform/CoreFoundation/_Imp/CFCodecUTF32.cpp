@@ -96,8 +96,9 @@ class Writer : private EncodeCursor {
     }
 };
 
-// No more units than cannot overflow a count of 16 bits.
-constexpr CFIndex countedAtOnce = 32768;
+// So few units that their count does not overflow 16 bits, and that plain text behind them is seen
+// soon.
+constexpr CFIndex countedAtOnce = 512;
 
 // The pairs that end in one of at most `countedAtOnce` units, in front of which one more stands.
 CFIndex countPairs(UniChar const* units, CFIndex count) {
@@ -117,8 +118,12 @@ CFIndex countPairs(UniChar const* units, CFIndex count) {
 Encoded measure(UniChar const* units, CFIndex count, UInt8 lossByte) {
     CFIndex const reached = lossByte != 0 ? count : pairedFront(units, count);
     CFIndex elements = reached;
-    for (CFIndex i = 1; i < reached; i += countedAtOnce)
-        elements -= countPairs(units + i, std::min(countedAtOnce, reached - i));
+    for (CFIndex i = 1; i < reached;) {
+        i += clearFront(units + i, reached - i, surrogates);
+        CFIndex const rest = std::min(countedAtOnce, reached - i);
+        elements -= countPairs(units + i, rest);
+        i += rest;
+    }
     return {reached, 4 * elements};
 }
 

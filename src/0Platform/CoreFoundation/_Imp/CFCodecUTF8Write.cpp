@@ -122,8 +122,8 @@ class Writer : private EncodeCursor {
     bool startsRun(UniChar least) const { return units[0] >= least && units[2] >= least; }
 };
 
-// A multiple of a block, and no more than cannot overflow a count of 16 bits.
-constexpr CFIndex countedAtOnce = 16384;
+// So few units that their count does not overflow 16 bits, and that ASCII behind them is seen soon.
+constexpr CFIndex countedAtOnce = 512;
 
 // The bytes of a unit beyond the first. Half of a surrogate pair stands for two bytes.
 CFIndex extraBytes(UniChar unit) {
@@ -133,6 +133,10 @@ CFIndex extraBytes(UniChar unit) {
 // The same for a block: taking away a mark adds one.
 Units8 extraBytes(Units8 units) {
     return surrogates(units) - nonZero(units & 0xFF80) - nonZero(units & 0xF800);
+}
+
+Units8 aboveAscii(Units8 units) {
+    return units & 0xFF80;
 }
 
 struct Counted {
@@ -170,10 +174,13 @@ Encoded measureUTF8(UniChar const* units, CFIndex count) noexcept {
         return {0, 0};
     bool paired = !isLowSurrogate(units[0]) && !isHighSurrogate(units[count - 1]);
     CFIndex bytes = 1 + extraBytes(units[0]);
-    for (CFIndex i = 1; i < count; i += countedAtOnce) {
-        Counted const counted = countBytes(units + i, std::min(countedAtOnce, count - i));
-        bytes += counted.bytes;
-        paired = paired && counted.paired;
+    for (CFIndex i = 1; i < count;) {
+        CFIndex const ascii = clearFront(units + i, count - i, aboveAscii);
+        CFIndex const rest = std::min(countedAtOnce, count - i - ascii);
+        Counted const counted = countBytes(units + i + ascii, rest);
+        bytes += ascii + counted.bytes;
+        paired = paired && counted.paired && (ascii == 0 || !isHighSurrogate(units[i - 1]));
+        i += ascii + rest;
     }
     return paired ? Encoded{count, bytes} : measureUTF8(units, pairedFront(units, count));
 }

@@ -144,6 +144,21 @@ inline CFIndex forEachBlock(UniChar const* units, CFIndex count, TAdd const& add
     return 0;
 }
 
+/// How many units, four blocks at a time, stand in front of a block of which `mark` leaves a lane
+/// that is not zero.
+template <class TMark>
+inline CFIndex clearFront(UniChar const* units, CFIndex count, TMark const& mark) {
+    CFIndex index = 0;
+    for (; count - index >= 32; index += 32) {
+        auto const marked = [&](int block) {
+            return mark(load<Units8>(units + index + 8 * block));
+        };
+        if (clearLanes(marked(0) | marked(1) | marked(2) | marked(3)) < 8)
+            break;
+    }
+    return index;
+}
+
 /// Surrogate pairs, the high half in front, of code points less 10000.
 inline Words4 splitPairs(Words4 beyond) {
     return 0xDC00D800U + (beyond >> 10) + ((beyond & 0x3FF) << 16);
