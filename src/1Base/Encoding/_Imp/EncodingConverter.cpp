@@ -17,91 +17,146 @@ constexpr CFIndex passBytes = 8192;
 // What stands in for a character that the target lacks.
 constexpr UInt8 lossByte = '?';
 
-template <class TString>
-CFIndex byteCount(TString const& text) {
-    return static_cast<CFIndex>(text.size() * sizeof(typename TString::value_type));
+// The platform's value for an encoding, and the two that a failure tells: the one in its text and
+// the one that the conversion was called with.
+struct CEncoding {
+    CFStringEncoding platform;
+    EEncoding named;
+    EEncoding given;
+};
+
+[[noreturn]] void fail(char const* function, std::string const& error, CEncoding const& encoding) {
+    Detail::throwConversionError(function, error + getEncodingName(encoding.named),
+                                 static_cast<ESysEncoding>(encoding.given));
 }
 
-template <class TString>
-CFStringRef createString(TString const& source, CFStringEncoding encoding, EEncoding named,
-                         EEncoding given) {
-    auto const* const bytes = reinterpret_cast<UInt8 const*>(source.data());
-    CFStringRef const ref =
-        CFStringCreateWithBytes(kCFAllocatorDefault, bytes, byteCount(source), encoding, false);
+template <class TText>
+CFStringRef createString(TText const& text, CEncoding const& encoding) {
+    CFStringRef const ref = CFStringCreateWithBytes(
+        kCFAllocatorDefault, reinterpret_cast<UInt8 const*>(text.data()),
+        static_cast<CFIndex>(text.size() * sizeof(typename TText::value_type)), encoding.platform,
+        false);
     if (ref == nullptr)
-        Detail::throwConversionError("CFStringCreateWithBytes",
-                                     "Could not create string with encoding " +
-                                         getEncodingName(named),
-                                     static_cast<ESysEncoding>(given));
+        fail("CFStringCreateWithBytes", "Could not create string with encoding ", encoding);
     return ref;
 }
 
 // One call of CFStringGetBytes; a null buffer measures. Reading nothing is an error, and then the
 // string stays unreleased.
-CFIndex readBytes(CFStringRef ref, CFRange range, CFStringEncoding encoding, UInt8* buffer,
-                  CFIndex size, CFIndex& used, EEncoding named, EEncoding given) {
-    CFIndex const converted =
-        CFStringGetBytes(ref, range, encoding, lossByte, false, buffer, size, &used);
+CFIndex readBytes(CFStringRef ref, CFRange range, CEncoding const& encoding, void* buffer,
+                  CFIndex size, CFIndex& used) {
+    CFIndex const converted = CFStringGetBytes(ref, range, encoding.platform, lossByte, false,
+                                               static_cast<UInt8*>(buffer), size, &used);
     if (converted == 0)
-        Detail::throwConversionError("CFStringGetBytes",
-                                     "Could not get string with encoding " + getEncodingName(named),
-                                     static_cast<ESysEncoding>(given));
+        fail("CFStringGetBytes", "Could not get string with encoding ", encoding);
     return converted;
 }
 
-// Reads the whole string into a text of the target kind and releases it.
-template <class TTarget>
-TTarget takeString(CFStringRef ref, CFStringEncoding encoding, EEncoding named, EEncoding given) {
-    using TElement = typename TTarget::value_type;
-    constexpr CFIndex width = sizeof(TElement);
-
-    TTarget result;
-    CFIndex const length = CFStringGetLength(ref);
-    CFIndex used = 0;
-    readBytes(ref, CFRangeMake(0, length), encoding, nullptr, 0, used, named, given);
-    CFIndex const bufferBytes = std::min(used, passBytes);
-    if (length < 1) {
-        CFRelease(ref);
-        return result;
+// One pass over a string: a fresh buffer, and in it what it could hold of the units from `done` on,
+// which moves behind them.
+template <class TElement>
+class CPass {
+  public:
+    CPass(CFStringRef ref, CFIndex length, CFIndex& done, CEncoding const& encoding, CFIndex bytes)
+        : buffer_(new TElement[static_cast<std::size_t>(bytes) / sizeof(TElement)]) {
+        done +=
+            readBytes(ref, CFRangeMake(done, length - done), encoding, buffer_.get(), bytes, used_);
     }
-    result.reserve(static_cast<std::size_t>(used / width));
-    CFRange rest = CFRangeMake(0, length);
-    for (;;) {
-        boost::scoped_array<TElement> const buffer(
-            new TElement[static_cast<std::size_t>(bufferBytes / width)]);
-        CFIndex const converted =
-            readBytes(ref, rest, encoding, reinterpret_cast<UInt8*>(buffer.get()), bufferBytes,
-                      used, named, given);
-        result.append(buffer.get(), static_cast<std::size_t>(used / width));
-        if (converted >= rest.length)
-            break;
-        rest = CFRangeMake(rest.location + converted, rest.length - converted);
+
+    TElement const* data() const { return buffer_.get(); }
+    std::size_t size() const { return static_cast<std::size_t>(used_) / sizeof(TElement); }
+
+  private:
+    boost::scoped_array<TElement> buffer_;
+    CFIndex used_ = 0;
+};
+
+// Reads the whole string into a text of the target kind and releases it.
+template <class TText>
+TText takeString(CFStringRef ref, CEncoding const& encoding) {
+    using TElement = typename TText::value_type;
+
+    CFIndex const length = CFStringGetLength(ref);
+    CFIndex total = 0;
+    readBytes(ref, CFRangeMake(0, length), encoding, nullptr, 0, total);
+    CFIndex const bufferBytes = std::min(total, passBytes);
+    CFIndex done = 0;
+    // What fits into one pass is made from it in its size.
+    auto const readAtOnce = [&] {
+        if (length < 1 || total > passBytes)
+            return TText();
+        CPass<TElement> const pass(ref, length, done, encoding, bufferBytes);
+        return TText(pass.data(), pass.size());
+    };
+    TText text = readAtOnce();
+    while (done < length) {
+        text.reserve(static_cast<std::size_t>(total) / sizeof(TElement));
+        CPass<TElement> const pass(ref, length, done, encoding, bufferBytes);
+        text.append(pass.data(), pass.size());
     }
     CFRelease(ref);
-    return result;
+    return text;
 }
 
-template <class TString>
-Strings::stringUTF16 convertToUTF16_(TString const& source, EEncoding encoding) {
+// UTF-16 between the two steps of a conversion. Short, as most texts are, it needs no heap.
+class CHub {
+  public:
+    using value_type = short;
+
+    CHub() {}
+    CHub(short const* text, std::size_t count) { append(text, count); }
+
+    void reserve(std::size_t size) { long_.reserve(size); }
+
+    void append(short const* text, std::size_t count) {
+        if (size_ + count <= shortSize) {
+            std::copy_n(text, count, short_ + size_);
+        } else {
+            if (long_.empty())
+                long_.assign(short_, size_);
+            long_.append(text, count);
+        }
+        size_ += count;
+    }
+
+    short const* data() const { return size_ <= shortSize ? short_ : long_.data(); }
+    std::size_t size() const { return size_; }
+    bool empty() const { return size_ == 0; }
+
+  private:
+    static constexpr std::size_t shortSize = 256;
+
+    short short_[shortSize]; // the text up to this size, unused beyond it
+    Strings::stringUTF16 long_;
+    std::size_t size_ = 0;
+};
+
+template <class TUTF16, class TString>
+TUTF16 convertToUTF16_(TString const& source, EEncoding encoding) {
     if (source.empty())
-        return Strings::stringUTF16();
-    CFStringRef const ref = createString(source, findEncoding(encoding), encoding, encoding);
-    return takeString<Strings::stringUTF16>(ref, kCFStringEncodingUnicode, eencUTF16, encoding);
+        return TUTF16();
+    CFStringRef const ref = createString(source, {findEncoding(encoding), encoding, encoding});
+    return takeString<TUTF16>(ref, {kCFStringEncodingUnicode, eencUTF16, encoding});
 }
 
-template <class TString>
-TString convertFromUTF16_(Strings::stringUTF16 const& source, EEncoding encoding) {
+template <class TString, class TUTF16>
+TString convertFromUTF16_(TUTF16 const& source, EEncoding encoding) {
     if (source.empty())
         return TString();
-    CFStringRef const ref = createString(source, kCFStringEncodingUnicode, eencUTF16, encoding);
-    return takeString<TString>(ref, findEncoding(encoding), encoding, encoding);
+    CFStringRef const ref = createString(source, {kCFStringEncodingUnicode, eencUTF16, encoding});
+    return takeString<TString>(ref, {findEncoding(encoding), encoding, encoding});
+}
+
+template <class TTarget, class TSource>
+TTarget convertThroughUTF16(TSource const& source, EEncoding from, EEncoding to) {
+    return convertFromUTF16_<TTarget>(convertToUTF16_<CHub>(source, from), to);
 }
 
 } // namespace
 
 Strings::stringUTF16
 CConverter<Strings::stringUTF16, std::string>::convert(std::string const& source) {
-    return convertToUTF16_(source, eencUTF8);
+    return convertToUTF16_<Strings::stringUTF16>(source, eencUTF8);
 }
 
 std::string
@@ -111,7 +166,7 @@ CConverter<std::string, Strings::stringUTF16>::convert(Strings::stringUTF16 cons
 
 Strings::stringUTF16
 CConverter<Strings::stringUTF16, Strings::string>::convert(Strings::string const& source) {
-    return convertToUTF16_(source, eencUTF32);
+    return convertToUTF16_<Strings::stringUTF16>(source, eencUTF32);
 }
 
 Strings::string
@@ -121,7 +176,7 @@ CConverter<Strings::string, Strings::stringUTF16>::convert(Strings::stringUTF16 
 
 Strings::stringUTF16 CConverter<Strings::stringUTF16, std::basic_string<unsigned char>>::convert(
     std::basic_string<unsigned char> const& source, ESysEncoding encoding) {
-    return convertToUTF16_(source, static_cast<EEncoding>(encoding));
+    return convertToUTF16_<Strings::stringUTF16>(source, static_cast<EEncoding>(encoding));
 }
 
 std::basic_string<unsigned char>
@@ -132,18 +187,17 @@ CConverter<std::basic_string<unsigned char>, Strings::stringUTF16>::convert(
 }
 
 std::string CConverter<std::string, Strings::string>::convert(Strings::string const& source) {
-    return convertFromUTF16_<std::string>(convertToUTF16_(source, eencUTF32), eencUTF8);
+    return convertThroughUTF16<std::string>(source, eencUTF32, eencUTF8);
 }
 
 Strings::string CConverter<Strings::string, std::string>::convert(std::string const& source) {
-    return convertFromUTF16_<Strings::string>(convertToUTF16_(source, eencUTF8), eencUTF32);
+    return convertThroughUTF16<Strings::string>(source, eencUTF8, eencUTF32);
 }
 
 std::basic_string<unsigned char>
 CConverter<std::basic_string<unsigned char>, Strings::string>::convert(
     Strings::string const& source) {
-    return convertFromUTF16_<std::basic_string<unsigned char>>(convertToUTF16_(source, eencUTF32),
-                                                               eencISO8859_1);
+    return convertThroughUTF16<std::basic_string<unsigned char>>(source, eencUTF32, eencISO8859_1);
 }
 
 } // namespace Encoding
