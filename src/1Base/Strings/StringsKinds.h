@@ -14,10 +14,7 @@
 namespace Strings {
 namespace Detail {
 
-template <class TText>
-struct CTag_Name_EncUTF16 {
-    static TText get_tag_name() { return "EncUTF16"; }
-};
+TEMPLMETA_TAG_NAME(EncUTF16);
 
 /// Traits that differ from the standard ones by their type alone, so that text in an encoding is
 /// a type of its own: no other std::basic_string<short> is taken for UTF-16.

@@ -1,9 +1,10 @@
-/// Compile-time tags: types that stand for a name.
+/// Compile-time tags: types that stand for a name and can say it.
 ///
-///     template <class TText> struct CTag_Name_Example {
-///         static TText get_tag_name() { return "Example"; }
-///     };
-///     using TExample = TemplMeta::CTag<CTag_Name_Example<char const*> >;
+///     namespace Time {
+///     TEMPLMETA_TAG_NAME(TimeDate);
+///     using TTagTimeDate = TemplMeta::CTag<CTag_Name_TimeDate<char const*>>;
+///     }
+///     TemplMeta::getTagName<Time::TTagTimeDate>()   // "TimeDate"
 #ifndef QORN_1BASE_TEMPLMETATAG_H
 #define QORN_1BASE_TEMPLMETATAG_H
 
@@ -12,10 +13,27 @@ namespace TemplMeta {
 /// The end of every list, and the mark of a template argument that is left free.
 struct CNil {};
 
-/// Stands for one name. Two tags are the same exactly when their types are.
-template <class TName>
-struct CTag {};
+/// Stands for one name. Two tags are the same exactly when their types are, so a tag in an
+/// anonymous namespace differs from a public one of the same name.
+template <class TTagName>
+struct CTag {
+    using TName = TTagName;
+};
+
+/// The name that a tag stands for, a static text.
+template <class TTag>
+constexpr char const* getTagName() {
+    return TTag::TName::get_tag_name();
+}
 
 } // namespace TemplMeta
+
+/// Declares the tag-name class of the tag `name` in the enclosing namespace: the module's own for a
+/// public tag, an anonymous one for a tag of a single file.
+#define TEMPLMETA_TAG_NAME(name)                                                                   \
+    template <class TText>                                                                         \
+    struct CTag_Name_##name {                                                                      \
+        static constexpr TText get_tag_name() { return #name; }                                    \
+    }
 
 #endif
