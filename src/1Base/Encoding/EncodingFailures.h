@@ -1,38 +1,21 @@
-/// What a failed conversion ends in.
+/// What a failed conversion ends in. Kept out of line, so that the many conversions stay small, and
+/// apart from the exceptions, which are written in terms of conversions themselves.
 #ifndef QORN_1BASE_ENCODINGFAILURES_H
 #define QORN_1BASE_ENCODINGFAILURES_H
 
 #include "1Base/Encoding/EncodingSysEncoding.h"
 
-#include <stdexcept>
 #include <string>
 
 namespace Encoding {
 namespace Detail {
 
-/// A conversion that the platform refused.
-struct XConversion : std::runtime_error {
-    XConversion(std::string const& function, std::string const& error, ESysEncoding encoding);
-
-    std::string function;
-    std::string error;
-    ESysEncoding eenc;
-};
-
-/// A check of the text modules that did not hold.
-struct XCheck : std::logic_error {
-    using std::logic_error::logic_error;
-};
-
-/// Reports that a conversion would call itself.
+/// Fails as an assertion: a conversion would call itself.
 [[noreturn]] void reportRecursion();
 
-/// Reports that the platform call `function` failed, with `error` and the encoding it was given.
+/// Raises TExcEncoding: the platform call `function` failed, with `error`, for `encoding`.
 [[noreturn]] void throwConversionError(char const* function, std::string const& error,
                                        ESysEncoding encoding);
-
-/// Reports that the check `expression` failed.
-[[noreturn]] void reportFailedCheck(char const* expression);
 
 } // namespace Detail
 } // namespace Encoding

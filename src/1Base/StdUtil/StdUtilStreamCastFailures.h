@@ -2,23 +2,12 @@
 #ifndef QORN_1BASE_STDUTILSTREAMCASTFAILURES_H
 #define QORN_1BASE_STDUTILSTREAMCASTFAILURES_H
 
-#include <stdexcept>
-#include <string>
-
 namespace StdUtil {
 namespace Detail {
 
-/// A cast that the stream refused.
-struct XStreamCast : std::runtime_error {
-    XStreamCast(std::string const& source, std::string const& target);
-
-    std::string source;
-    std::string target;
-};
-
-/// Reports that a value of the type `source` could not be cast to `target`; both are the raw names
-/// of the compiler. The other arguments say where, as of the caster's source. Kept out of line, so
-/// that each of the many casts holds one call and its constant texts.
+/// Raises TExcStreamCast: a value of the type `source` could not be cast to `target`; both are the
+/// raw names of the compiler. The other arguments say where, as of the caster's source. Kept out of
+/// line, so that each of the many casts holds one call and its constant texts.
 [[noreturn]] void throwStreamCastError(char const* file, unsigned int line, char const* func,
                                        char const* date, char const* time, char const* source,
                                        char const* target);

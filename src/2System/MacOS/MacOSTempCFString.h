@@ -4,6 +4,7 @@
 #ifndef QORN_2SYSTEM_MACOSTEMPCFSTRING_H
 #define QORN_2SYSTEM_MACOSTEMPCFSTRING_H
 
+#include "1Base/Error/ErrorMacros.h"
 #include "2System/MacOS/MacOSCFStringConverter.h"
 
 namespace MacOS {
@@ -12,10 +13,7 @@ namespace MacOS {
 class CTempCFString {
   public:
     /// Takes over the caller's ownership of `ref`. Fails a check for a null reference.
-    explicit CTempCFString(CFStringRef ref) : ref_(ref) {
-        if (ref == nullptr)
-            Encoding::Detail::reportFailedCheck("ref");
-    }
+    explicit CTempCFString(CFStringRef ref) : ref_(ERROR_ASSERT(ref)) {}
 
     /// A platform string of any string kind. Raises the conversion failure for a malformed text.
     template <class TString,

@@ -1,27 +1,23 @@
-// Plain standard exceptions, until the error module brings its own family.
-
 #include "1Base/Encoding/EncodingFailures.h"
+
+#include "1Base/Encoding/EncodingExc.h"
+#include "1Base/Error/ErrorMacros.h"
+
+#include <exception>
 
 namespace Encoding {
 namespace Detail {
 
-XConversion::XConversion(std::string const& function_, std::string const& error_,
-                         ESysEncoding encoding)
-    : std::runtime_error("Error in OS call " + function_ + ": " + error_),
-      function(function_),
-      error(error_),
-      eenc(encoding) {}
-
 void reportRecursion() {
-    throw XCheck("Infinite recursion in 'Encoding::CConverter<T,T>::convert()'!");
+    ERROR_ASSERT_P(Error::buildNamedParameter(
+                       "reason", "Infinite recursion in 'Encoding::CConverter<T,T>::convert()'!"),
+                   false);
+    std::terminate();
 }
 
-void throwConversionError(char const* function, std::string const& error, ESysEncoding encoding) {
-    throw XConversion(function, error, encoding);
-}
-
-void reportFailedCheck(char const* expression) {
-    throw XCheck(expression);
+void throwConversionError(char const* function, std::string const& error, ESysEncoding eenc) {
+    ERROR_THROW(TExcEncoding, Error::msgOSCall,
+                ERROR_PARAMS(ERROR_PARAM(eenc), ERROR_PARAM(function), ERROR_PARAM(error)));
 }
 
 } // namespace Detail

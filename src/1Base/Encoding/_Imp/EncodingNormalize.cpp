@@ -1,5 +1,6 @@
 #include "1Base/Encoding/EncodingNormalize.h"
-#include "1Base/Encoding/EncodingFailures.h"
+
+#include "1Base/Error/ErrorMacros.h"
 
 #include <CoreFoundation/CoreFoundation.h>
 
@@ -19,12 +20,10 @@ Strings::stringUTF16 normalize(Strings::stringUTF16 const& source, EUTF16Normali
     CFStringRef const ref = CFStringCreateWithCharacters(
         kCFAllocatorDefault, reinterpret_cast<UniChar const*>(source.data()),
         static_cast<CFIndex>(source.size()));
-    if (ref == nullptr)
-        Detail::reportFailedCheck("ref");
+    ERROR_ASSERT(ref);
     CFMutableStringRef const mref = CFStringCreateMutableCopy(kCFAllocatorDefault, 0, ref);
     CFRelease(ref);
-    if (mref == nullptr)
-        Detail::reportFailedCheck("mref");
+    ERROR_ASSERT(mref);
     CFStringNormalize(mref, getMacNormalizationForm(form));
 
     CFIndex const length = CFStringGetLength(mref);

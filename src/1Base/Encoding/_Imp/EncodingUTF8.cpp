@@ -1,5 +1,6 @@
 #include "1Base/Encoding/EncodingUTF8.h"
-#include "1Base/Encoding/EncodingFailures.h"
+
+#include "1Base/Error/ErrorMacros.h"
 
 namespace Encoding {
 namespace {
@@ -42,10 +43,8 @@ Strings::stringUTF32 convertUTF8ToUTF32(Strings::stringUTF8 const& source) {
             owed = beginSequence(ret, cutf8);
             continue;
         }
-        if (ret.empty())
-            Detail::reportFailedCheck("!ret.empty()");
-        if (0x80 != (0xc0 & cutf8))
-            Detail::reportFailedCheck("0x80 == (0xc0 & cutf8)");
+        ERROR_ASSERT(!ret.empty());
+        ERROR_ASSERT(0x80 == (0xc0 & cutf8));
         ret.back() =
             static_cast<wchar_t>((static_cast<unsigned int>(ret.back()) << 6) | (cutf8 & 0x3FU));
         --owed;

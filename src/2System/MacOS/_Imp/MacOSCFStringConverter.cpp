@@ -1,5 +1,7 @@
 #include "2System/MacOS/MacOSCFStringConverter.h"
 
+#include "1Base/Error/ErrorMacros.h"
+
 #include <boost/smart_ptr/scoped_array.hpp>
 
 namespace MacOS {
@@ -23,8 +25,7 @@ Strings::stringUTF16 readUnits(CFStringRef ref) {
 } // namespace
 
 Strings::stringUTF16 GetStringUTF16FromCFString(CFStringRef ref) {
-    if (ref == nullptr)
-        Encoding::Detail::reportFailedCheck("ref");
+    ERROR_ASSERT(ref);
     UniChar const* const units = CFStringGetCharactersPtr(ref);
     CFIndex const length = units == nullptr ? 0 : CFStringGetLength(ref);
     if (length > 0)
