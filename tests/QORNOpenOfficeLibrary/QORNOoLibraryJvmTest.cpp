@@ -19,7 +19,7 @@ using BridgeTest::edStatic;
 using BridgeTest::TFolders;
 using BridgeTest::TTexts;
 
-std::atomic<bool> conversionsFail{false};
+std::atomic<bool> nextConversionFails{false};
 
 } // namespace
 
@@ -31,7 +31,8 @@ CFStringRef __real_CFStringCreateWithBytes(CFAllocatorRef, UInt8 const*, CFIndex
 CFStringRef __wrap_CFStringCreateWithBytes(CFAllocatorRef allocator, UInt8 const* bytes,
                                            CFIndex count, CFStringEncoding encoding,
                                            Boolean external) {
-    if (conversionsFail)
+    // Only one: the exception's own texts are converted as well.
+    if (nextConversionFails.exchange(false))
         return nullptr;
     return __real_CFStringCreateWithBytes(allocator, bytes, count, encoding, external);
 }
@@ -60,7 +61,7 @@ class CQORNOoLibraryJvmTest : public TestSupport::CObjectCountTest {
         rlimit const noCore = {0, 0};
         setrlimit(RLIMIT_CORE, &noCore);
         bridge();
-        conversionsFail = true;
+        nextConversionFails = true;
         bridge().initialize({u"/a", u"/b", u"/c", u"/d", u"/e"});
     }
 
