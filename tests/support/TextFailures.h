@@ -5,7 +5,9 @@
 #ifndef QORN_TESTS_TEXTFAILURES_H
 #define QORN_TESTS_TEXTFAILURES_H
 
-#include "1Base/Encoding/EncodingFailures.h"
+#include "1Base/Encoding/EncodingConverter.h"
+#include "1Base/Encoding/EncodingExc.h"
+#include "1Base/Error/ErrorExcChains.h"
 
 #include <ostream>
 #include <string>
@@ -26,24 +28,34 @@ inline std::ostream& operator<<(std::ostream& stream, CConversionFailure const& 
     return stream << failure.function << ": " << failure.error << " (" << failure.eenc << ")";
 }
 
+/// The value of the parameter `name` of an exception; empty where it has none.
+inline std::string parameterOf(Error::CException const& exc, std::string const& name) {
+    for (auto const& entry : exc.getInfo().getMessage())
+        if (entry.getName() == name)
+            return Encoding::convert<std::string>(entry.getValue());
+    return "";
+}
+
 /// The failure that `call` raises; with empty texts where it raises none.
 template <class TCall>
 CConversionFailure conversionFailureOf(TCall const& call) {
     try {
         call();
-    } catch (Encoding::Detail::XConversion const& failure) {
-        return {failure.function, failure.error, static_cast<unsigned int>(failure.eenc)};
+    } catch (Encoding::TExcEncoding const& exc) {
+        return {parameterOf(exc, "function"), parameterOf(exc, "error"),
+                static_cast<unsigned int>(std::stoul(parameterOf(exc, "eenc")))};
     }
     return {"", "", 0};
 }
 
-/// The text of the check that fails in `call`; empty where none does.
+/// The parameter `name` of the assertion that fails in `call`, as a rule its expression; empty
+/// where none does.
 template <class TCall>
-std::string failedCheckOf(TCall const& call) {
+std::string failedCheckOf(TCall const& call, std::string const& name = "expr") {
     try {
         call();
-    } catch (Encoding::Detail::XCheck const& failure) {
-        return failure.what();
+    } catch (Error::TExcErrorAssert const& exc) {
+        return parameterOf(exc, name);
     }
     return "";
 }

@@ -127,7 +127,7 @@ TEST_F(CEncodingConverterTest, ArraysAndPointersToVariablesAreZeroTerminatedText
 
 template <class TTarget, class TSource>
 std::string recursionOf(TSource const& source) {
-    return TestSupport::failedCheckOf([&source] { convert<TTarget>(source); });
+    return TestSupport::failedCheckOf([&source] { convert<TTarget>(source); }, "reason");
 }
 
 TEST_F(CEncodingConverterTest, APairWithoutAConverterOfItsOwnReportsARecursion) {

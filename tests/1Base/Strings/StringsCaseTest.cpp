@@ -1,5 +1,6 @@
 #include "1Base/Strings/StringsCase.h"
 #include "1Base/Encoding/Encoding.h"
+#include "1Base/Encoding/EncodingExc.h"
 
 #include "support/ObjectCount.h"
 #include "support/PlatformCalls.h"
@@ -12,7 +13,7 @@
 extern "C" double __wrap_kCFCoreFoundationVersionNumber;
 double __wrap_kCFCoreFoundationVersionNumber = 1674.102;
 
-using Encoding::Detail::XConversion;
+using Encoding::TExcEncoding;
 using TestSupport::CPlatformCall;
 using TestSupport::CPlatformCalls;
 
@@ -226,16 +227,16 @@ TEST_F(CStringsCaseTest, AFailedConversionReleasesTheLocaleAndChangesNothing) {
     for (std::string const& invalid :
          {std::string("ab\xFF"), std::string("\xC3"), std::string("\xED\xA0\x80")}) {
         std::string text = invalid;
-        EXPECT_THROW(Strings::toUpper(text), XConversion);
+        EXPECT_THROW(Strings::toUpper(text), TExcEncoding);
         EXPECT_EQ(text, invalid);
-        EXPECT_THROW(Strings::toLower(text), XConversion);
+        EXPECT_THROW(Strings::toLower(text), TExcEncoding);
         EXPECT_EQ(text, invalid);
     }
     Strings::string const invalid = {L'a', static_cast<wchar_t>(0xD800)};
     Strings::string text = invalid;
-    EXPECT_THROW(Strings::toUpper(text), XConversion);
-    EXPECT_THROW(Strings::toLower(text), XConversion);
-    EXPECT_THROW(Strings::toLower(invalid), XConversion);
+    EXPECT_THROW(Strings::toUpper(text), TExcEncoding);
+    EXPECT_THROW(Strings::toLower(text), TExcEncoding);
+    EXPECT_THROW(Strings::toLower(invalid), TExcEncoding);
     EXPECT_EQ(text, invalid);
     EXPECT_EQ(calls.of("CFLocaleCopyCurrent").size(), 9U);
     EXPECT_EQ(calls.of("CFRelease").size(), 9U);
@@ -249,7 +250,7 @@ TEST_F(CStringsCaseTest, AFailedReadLeavesNoMoreThanItsOwnString) {
         CPlatformCalls calls;
         calls.fail("CFStringGetBytes", nth);
         std::string text = "abc";
-        EXPECT_THROW(Strings::toUpper(text), XConversion) << nth;
+        EXPECT_THROW(Strings::toUpper(text), TExcEncoding) << nth;
         EXPECT_EQ(text, "abc") << nth;
         EXPECT_EQ(TestSupport::liveObjects(), before + 1) << nth;
         CFRelease(calls.of("CFStringGetBytes").back().object);
@@ -260,7 +261,7 @@ TEST_F(CStringsCaseTest, AFailureOnTheWayOutLeavesNothing) {
     CPlatformCalls calls;
     calls.fail("CFStringCreateWithBytes", 2);
     Strings::string text = L"abc";
-    EXPECT_THROW(Strings::toLower(text), XConversion);
+    EXPECT_THROW(Strings::toLower(text), TExcEncoding);
     EXPECT_EQ(text, L"abc");
 }
 

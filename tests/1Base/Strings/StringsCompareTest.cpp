@@ -1,5 +1,6 @@
 #include "1Base/Strings/StringsCompare.h"
 #include "1Base/Encoding/Encoding.h"
+#include "1Base/Encoding/EncodingExc.h"
 
 #include "support/ObjectCount.h"
 #include "support/PlatformCalls.h"
@@ -10,7 +11,7 @@
 #include <string>
 #include <vector>
 
-using Encoding::Detail::XConversion;
+using Encoding::TExcEncoding;
 using Strings::stricmp;
 using Strings::strnatcmp;
 using TestSupport::CPlatformCall;
@@ -160,21 +161,21 @@ TEST_F(CStringsCompareTest, ThePlatformComparesTheWholeOfBothTexts) {
 TEST_F(CStringsCompareTest, InvalidTextOnEitherSideEndsInTheConversionsFailure) {
     for (std::string const& invalid : {std::string("a\xFF"), std::string("\xC3"),
                                        std::string("\xED\xA0\x80"), std::string("\xC0\x80")}) {
-        EXPECT_THROW(stricmp(invalid, std::string("a")), XConversion);
-        EXPECT_THROW(stricmp(std::string("a"), invalid), XConversion);
-        EXPECT_THROW(stricmp(invalid.c_str(), "a"), XConversion);
-        EXPECT_THROW(stricmp("a", invalid.c_str()), XConversion);
-        EXPECT_THROW(strnatcmp(invalid, std::string("a")), XConversion);
-        EXPECT_THROW(strnatcmp(std::string("a"), invalid), XConversion);
-        EXPECT_THROW(strnatcmp(invalid.c_str(), "a"), XConversion);
-        EXPECT_THROW(strnatcmp("a", invalid.c_str()), XConversion);
+        EXPECT_THROW(stricmp(invalid, std::string("a")), TExcEncoding);
+        EXPECT_THROW(stricmp(std::string("a"), invalid), TExcEncoding);
+        EXPECT_THROW(stricmp(invalid.c_str(), "a"), TExcEncoding);
+        EXPECT_THROW(stricmp("a", invalid.c_str()), TExcEncoding);
+        EXPECT_THROW(strnatcmp(invalid, std::string("a")), TExcEncoding);
+        EXPECT_THROW(strnatcmp(std::string("a"), invalid), TExcEncoding);
+        EXPECT_THROW(strnatcmp(invalid.c_str(), "a"), TExcEncoding);
+        EXPECT_THROW(strnatcmp("a", invalid.c_str()), TExcEncoding);
     }
     for (Strings::string const& invalid : {Strings::string(1, static_cast<wchar_t>(0xD800)),
                                            Strings::string(1, static_cast<wchar_t>(0x110000))}) {
-        EXPECT_THROW(stricmp(invalid, Strings::string(L"a")), XConversion);
-        EXPECT_THROW(stricmp(L"a", invalid.c_str()), XConversion);
-        EXPECT_THROW(strnatcmp(Strings::string(L"a"), invalid), XConversion);
-        EXPECT_THROW(strnatcmp(invalid.c_str(), L"a"), XConversion);
+        EXPECT_THROW(stricmp(invalid, Strings::string(L"a")), TExcEncoding);
+        EXPECT_THROW(stricmp(L"a", invalid.c_str()), TExcEncoding);
+        EXPECT_THROW(strnatcmp(Strings::string(L"a"), invalid), TExcEncoding);
+        EXPECT_THROW(strnatcmp(invalid.c_str(), L"a"), TExcEncoding);
     }
 }
 
@@ -185,7 +186,7 @@ TEST_F(CStringsCompareTest, AFailedReadLeavesNoMoreThanItsOwnString) {
     for (int nth = 1; nth <= 4; ++nth) {
         CPlatformCalls calls;
         calls.fail("CFStringGetBytes", nth);
-        EXPECT_THROW(stricmp("abc", "def"), XConversion) << nth;
+        EXPECT_THROW(stricmp("abc", "def"), TExcEncoding) << nth;
         EXPECT_EQ(TestSupport::liveObjects(), before + 1) << nth;
         CFRelease(calls.of("CFStringGetBytes").back().object);
     }
