@@ -39,6 +39,14 @@ class CPlatformWatch {
     static bool isWatched() { return recorder != nullptr && depth == 1; }
 };
 
+CPlatformPause::CPlatformPause() {
+    ++depth;
+}
+
+CPlatformPause::~CPlatformPause() {
+    --depth;
+}
+
 CPlatformCalls::CPlatformCalls() {
     recorder = this;
 }

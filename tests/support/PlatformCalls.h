@@ -68,6 +68,15 @@ class CPlatformCalls {
     std::function<void(CPlatformCall const&)> observer_;
 };
 
+/// While it lives, this thread's calls reach the platform unwatched and unharmed.
+class CPlatformPause {
+  public:
+    CPlatformPause();
+    ~CPlatformPause();
+    CPlatformPause(CPlatformPause const&) = delete;
+    CPlatformPause& operator=(CPlatformPause const&) = delete;
+};
+
 } // namespace TestSupport
 
 #endif

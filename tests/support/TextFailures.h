@@ -5,7 +5,6 @@
 #ifndef QORN_TESTS_TEXTFAILURES_H
 #define QORN_TESTS_TEXTFAILURES_H
 
-#include "1Base/Encoding/EncodingConverter.h"
 #include "1Base/Encoding/EncodingExc.h"
 #include "1Base/Error/ErrorExcChains.h"
 
@@ -28,12 +27,15 @@ inline std::ostream& operator<<(std::ostream& stream, CConversionFailure const& 
     return stream << failure.function << ": " << failure.error << " (" << failure.eenc << ")";
 }
 
-/// The value of the parameter `name` of an exception; empty where it has none.
+/// The value of the parameter `name` of an exception, an ASCII text; empty where it has none. No
+/// conversion is called, which a test might be watching.
 inline std::string parameterOf(Error::CException const& exc, std::string const& name) {
+    std::string value;
     for (auto const& entry : exc.getInfo().getMessage())
         if (entry.getName() == name)
-            return Encoding::convert<std::string>(entry.getValue());
-    return "";
+            for (wchar_t const character : entry.getValue())
+                value += static_cast<char>(character);
+    return value;
 }
 
 /// The failure that `call` raises; with empty texts where it raises none.
