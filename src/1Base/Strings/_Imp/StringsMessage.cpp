@@ -107,7 +107,8 @@ CMessage<TChar, TParameterList>::findMate_(TText const& text, TChar const& open,
     std::size_t depth = 1;
     TChar const brackets[] = {open, close};
     while ((position = text.find_first_of(brackets, position + 1, 2)) != TText::npos) {
-        if (text[position] == open)
+        // The close character is asked for first: the two may be the same.
+        if (text[position] != close)
             ++depth;
         else if (--depth == 0)
             return position;
