@@ -1,8 +1,8 @@
 /// Messages with numbered texts.
 ///
-///     Error::CMessage const message(Error::msgNotFound, params);   // "@(type) @(key) was not
-///     found" message.getString(true);                                     // L"File /tmp/a was not
-///     found"
+///     // Of the template "@(type) @(key) was not found":
+///     Error::CMessage const message(Error::msgNotFound, params);
+///     message.getString(true);   // L"File /tmp/a was not found"
 #ifndef QORN_1BASE_ERRORMESSAGE_H
 #define QORN_1BASE_ERRORMESSAGE_H
 
