@@ -1,0 +1,3 @@
+#ifdef QORN_WRONG_USE
+static_assert(sizeof(char) == 2, "as expected");
+#endif
