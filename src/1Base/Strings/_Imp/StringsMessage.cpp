@@ -1,5 +1,6 @@
 #include "1Base/Strings/StringsMessage.h"
 
+#include <algorithm>
 #include <utility>
 
 namespace Strings {
@@ -8,6 +9,18 @@ namespace {
 constexpr wchar_t escapeCharacter = L'@';
 constexpr wchar_t openCharacter = L'(';
 constexpr wchar_t closeCharacter = L')';
+
+// Names are ASCII as a rule, and then a conversion would be most of an expansion's time.
+template <class TText>
+std::string narrowName(TText const& name) {
+    auto const isASCII = [](auto element) { return static_cast<unsigned long>(element) < 0x80; };
+    if (!std::all_of(name.begin(), name.end(), isASCII))
+        return Encoding::convert<std::string>(name);
+    std::string narrow(name.size(), '\0');
+    std::transform(name.begin(), name.end(), narrow.begin(),
+                   [](auto element) { return static_cast<char>(element); });
+    return narrow;
+}
 
 } // namespace
 
@@ -55,8 +68,7 @@ template <class TChar, class TParameterList>
 bool CMessage<TChar, TParameterList>::replaceParameter_(TText& text, TPosition position,
                                                         TPosition mate, TMap const& all,
                                                         TMap& remaining) const {
-    std::string const name =
-        Encoding::convert<std::string>(text.substr(position + 2, mate - position - 2));
+    std::string const name = narrowName(text.substr(position + 2, mate - position - 2));
     TPosition const length = mate - position + 1;
     // lower_bound, unlike find, gives the first of several equal names.
     auto const left = remaining.lower_bound(name);
