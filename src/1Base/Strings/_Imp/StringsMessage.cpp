@@ -1,6 +1,5 @@
 #include "1Base/Strings/StringsMessage.h"
 
-#include <algorithm>
 #include <utility>
 
 namespace Strings {
@@ -12,13 +11,13 @@ constexpr wchar_t closeCharacter = L')';
 
 // Names are ASCII as a rule, and then a conversion would be most of an expansion's time.
 template <class TText>
-std::string narrowName(TText const& name) {
-    auto const isASCII = [](auto element) { return static_cast<unsigned long>(element) < 0x80; };
-    if (!std::all_of(name.begin(), name.end(), isASCII))
-        return Encoding::convert<std::string>(name);
-    std::string narrow(name.size(), '\0');
-    std::transform(name.begin(), name.end(), narrow.begin(),
-                   [](auto element) { return static_cast<char>(element); });
+std::string narrowName(TText const& text, std::size_t begin, std::size_t end) {
+    std::string narrow(end - begin, '\0');
+    for (std::size_t i = begin; i < end; ++i) {
+        if (static_cast<unsigned long>(text[i]) >= 0x80)
+            return Encoding::convert<std::string>(text.substr(begin, end - begin));
+        narrow[i - begin] = static_cast<char>(text[i]);
+    }
     return narrow;
 }
 
@@ -68,7 +67,7 @@ template <class TChar, class TParameterList>
 bool CMessage<TChar, TParameterList>::replaceParameter_(TText& text, TPosition position,
                                                         TPosition mate, TMap const& all,
                                                         TMap& remaining) const {
-    std::string const name = narrowName(text.substr(position + 2, mate - position - 2));
+    std::string const name = narrowName(text, position + 2, mate);
     TPosition const length = mate - position + 1;
     // lower_bound, unlike find, gives the first of several equal names.
     auto const left = remaining.lower_bound(name);
@@ -115,15 +114,15 @@ CMessage<TChar, TParameterList>::findMate_(TText const& text, TChar const& open,
     if (text[position] != open)
         return TText::npos;
     // A depth rather than a recursion: a text of nothing but open characters must not end the
-    // stack.
+    // stack. The close character is asked for first: the two may be the same.
     std::size_t depth = 1;
-    TChar const brackets[] = {open, close};
-    while ((position = text.find_first_of(brackets, position + 1, 2)) != TText::npos) {
-        // The close character is asked for first: the two may be the same.
-        if (text[position] != close)
+    while (++position < text.size()) {
+        if (text[position] == close) {
+            if (--depth == 0)
+                return position;
+        } else if (text[position] == open) {
             ++depth;
-        else if (--depth == 0)
-            return position;
+        }
     }
     return TText::npos;
 }
