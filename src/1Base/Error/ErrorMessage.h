@@ -33,7 +33,7 @@ class CMessage : public Strings::CMessage<wchar_t, Strings::CParameterList<wchar
     };
 
     /// The text of `id`; an unknown one has the empty text, or what a loader makes of it.
-    CMessage(EMsgID const& id, Strings::CParameterList<wchar_t> const& params);
+    CMessage(EMsgID const& id, Strings::CParameterList<wchar_t> params);
 
     /// A narrow text (UTF-8) outside the catalogue, without parameters.
     template <class TT, class TA>

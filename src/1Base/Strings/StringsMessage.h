@@ -19,6 +19,7 @@
 #include <map>
 #include <ostream>
 #include <string>
+#include <utility>
 
 namespace Strings {
 
@@ -41,8 +42,8 @@ class CMessage {
         : text_(Encoding::convert<TText>(text)) {}
 
     template <class TC, class TT, class TA>
-    CMessage(std::basic_string<TC, TT, TA> const& text, TParameterList const& parameters)
-        : text_(Encoding::convert<TText>(text)), parameters_(parameters) {}
+    CMessage(std::basic_string<TC, TT, TA> const& text, TParameterList parameters)
+        : text_(Encoding::convert<TText>(text)), parameters_(std::move(parameters)) {}
 
     CMessage(CMessage const&) = default;
     CMessage(CMessage&&) = default;

@@ -16,8 +16,8 @@ Strings::string CMessage::CMessageLoader::load(EMsgID const& id) const {
     return L"<#" + StdUtil::stream_cast<Strings::string>(id) + L">?";
 }
 
-CMessage::CMessage(EMsgID const& id, Strings::CParameterList<wchar_t> const& params)
-    : TBase(loadMessage(id), params) {}
+CMessage::CMessage(EMsgID const& id, Strings::CParameterList<wchar_t> params)
+    : TBase(loadMessage(id), std::move(params)) {}
 
 CMessage::CMessage(CException const& exc) : TBase(StdUtil::stream_cast<Strings::string>(exc)) {}
 
