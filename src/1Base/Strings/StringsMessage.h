@@ -100,8 +100,9 @@ class CMessage {
                                TPosition position);
     static void addLeftoverPars_(TText& text, TMap& remaining);
 
-    bool replaceParameter_(TText& text, TPosition position, TPosition mate, TMap const& all,
-                           TMap& remaining) const;
+    template <class TSource>
+    void expand_(TText& text, TChar escape, TChar const& open, TChar const& close,
+                 TSource& source) const;
 
     mutable TText text_;
     TParameterList parameters_;

@@ -201,6 +201,23 @@ TEST_F(CErrorMessageTest, AMessageWritesItselfExpandedToBothKindsOfStream) {
     EXPECT_EQ(wide.str(), L"No permission to \u00E9tudier");
 }
 
+// Overrides the one operation alone.
+class CAnswering : public CMessage {
+  public:
+    using CMessage::CMessage;
+
+  protected:
+    std::wstring findMissingParamter(std::string const& name) const override {
+        return L"no " + std::wstring(name.begin(), name.end());
+    }
+};
+
+TEST_F(CErrorMessageTest, ASubclassMayAnswerWhatNoParameterDoes) {
+    TParameters parameters;
+    parameters.add("module", "FileSys");
+    EXPECT_EQ(CAnswering(Error::msgModuleError, parameters).getString(true), L"FileSys no error");
+}
+
 TEST_F(CErrorMessageTest, AnErrorOfTheOperatingSystemIsUnknown) {
     Error::COSErrMessage const message(5);
     EXPECT_EQ(message.getString(true), L"unknown error");

@@ -1,4 +1,5 @@
 // Expansion beside its slow twin, on random templates, with the text and the leftovers of two runs.
+// A message whose class overrides something and one whose class doesn't take different roads.
 
 #include "1Base/Strings/StringsMessageProbe.h"
 #include "1Base/Strings/StringsNaiveExpander.h"
@@ -13,6 +14,7 @@ namespace {
 using NaiveExpander::EOutcome;
 using NaiveExpander::TEntries;
 using TestSupport::CMessageProbe;
+using TestSupport::TMessage;
 using TestSupport::TParameters;
 
 // Together a million. Each seed is a test of its own, so that they run side by side.
@@ -106,7 +108,9 @@ TEST_P(CStringsMessageRandomTest, ExpansionAgreesWithItsSlowTwin) {
         if (first.outcome == EOutcome::eTooManyReplaced)
             continue;
         CMessageProbe const message(text, parametersOf(entries));
+        TMessage const plain(text, parametersOf(entries));
         ASSERT_EQ(message.getString(true), first.text) << testing::PrintToString(text);
+        ASSERT_EQ(plain.getString(true), first.text) << testing::PrintToString(text);
         ASSERT_EQ(message.leftovers(), first.leftovers) << testing::PrintToString(text);
         ++compared;
         withReplacements += first.replaced != 0;
@@ -115,9 +119,11 @@ TEST_P(CStringsMessageRandomTest, ExpansionAgreesWithItsSlowTwin) {
             NaiveExpander::expand(first.text, entries, mostReplaced);
         if (second.outcome == EOutcome::eTooManyReplaced)
             continue;
+        std::wstring const expected = second.text + suffixOf(second.leftovers);
         message.insertParameters(true);
-        ASSERT_EQ(message.getString(false), second.text + suffixOf(second.leftovers))
-            << testing::PrintToString(text);
+        plain.insertParameters(true);
+        ASSERT_EQ(message.getString(false), expected) << testing::PrintToString(text);
+        ASSERT_EQ(plain.getString(false), expected) << testing::PrintToString(text);
         ASSERT_EQ(message.leftovers(), second.leftovers) << testing::PrintToString(text);
     }
     std::cout << withReplacements << " with replacements, " << drawn - compared << " left out\n";

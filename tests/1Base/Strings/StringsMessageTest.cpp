@@ -118,6 +118,8 @@ TEST_F(CStringsMessageTest, EachConstructMeansWhatTheTableSays) {
         CMessageProbe const message(std::wstring(row.text), oneAndTwo());
         EXPECT_EQ(message.getString(true), row.result);
         EXPECT_EQ(message.leftovers(), row.leftovers);
+        // A class that overrides nothing takes a shorter road.
+        EXPECT_EQ(expand(row.text, oneAndTwo()), row.result);
     }
 }
 
@@ -201,6 +203,26 @@ TEST_F(CStringsMessageTest, EqualEntriesStandInTheOrderOfTheList) {
     TLeftovers const all = {{"a", L"9"}, {"k", L"5"}, {"k", L"3"},
                             {"k", L"4"}, {"k", L"3"}, {"z", L"0"}};
     EXPECT_EQ(leftoversOf(L"", list), all);
+}
+
+TEST_F(CStringsMessageTest, AnyNumberOfParametersIsServed) {
+    for (int const count : {1, 63, 64, 65, 300}) {
+        TParameters list;
+        for (int i = 0; i < count; ++i)
+            list.add("k", i);
+        list.add("last", L"end");
+        // One more use than there are values.
+        std::wstring text;
+        std::wstring expected;
+        for (int i = 0; i <= count; ++i) {
+            text += L"@(k) ";
+            expected += std::to_wstring(i % count) + L" ";
+        }
+        EXPECT_EQ(expand(text, list), expected) << count;
+        EXPECT_EQ(expandAll(text + L"@(last)", list), expected + L"end") << count;
+        EXPECT_EQ(leftoversOf(text, list), (TLeftovers{{"last", L"end"}})) << count;
+        EXPECT_EQ(expandAll(text, list), expected + L" (last: \"end\")") << count;
+    }
 }
 
 TEST_F(CStringsMessageTest, AValueIsExpandedInItsTurn) {

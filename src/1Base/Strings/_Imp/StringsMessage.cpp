@@ -1,5 +1,8 @@
 #include "1Base/Strings/StringsMessage.h"
 
+#include "1Base/Error/ErrorMessage.h"
+
+#include <typeinfo>
 #include <utility>
 
 namespace Strings {
@@ -21,15 +24,109 @@ std::string narrowName(TText const& text, std::size_t begin, std::size_t end) {
     return narrow;
 }
 
+// What a run's placeholders take their values from. `replaceBy` puts a value in the place of the
+// placeholder; only then is the entry used.
+
+template <class TMap>
+class CMapSource {
+  public:
+    CMapSource(TMap const& all, TMap& remaining) : all_(all), remaining_(remaining) {}
+
+    template <class TReplace>
+    bool use(std::string const& name, TReplace const& replaceBy) {
+        // lower_bound, unlike find, gives the first of several equal names.
+        auto const left = remaining_.lower_bound(name);
+        if (left != remaining_.end() && left->first == name) {
+            replaceBy(left->second);
+            remaining_.erase(left);
+            return true;
+        }
+        auto const used = all_.lower_bound(name);
+        if (used == all_.end() || used->first != name)
+            return false;
+        replaceBy(used->second);
+        return true;
+    }
+
+  private:
+    TMap const& all_;
+    TMap& remaining_;
+};
+
+// The same without maps, for the few parameters that a message has as a rule.
+template <class TParameterList>
+class CListSource {
+  public:
+    static constexpr std::size_t most = 64;
+
+    explicit CListSource(TParameterList const& list) : list_(list) {}
+
+    template <class TReplace>
+    bool use(std::string const& name, TReplace const& replaceBy) {
+        auto found = list_.end();
+        for (auto entry = list_.begin(); entry != list_.end(); ++entry) {
+            if (entry->getName() != name)
+                continue;
+            if (!isUsed(entry)) {
+                found = entry;
+                break;
+            }
+            if (found == list_.end())
+                found = entry;
+        }
+        if (found == list_.end())
+            return false;
+        replaceBy(found->getValue());
+        used_ |= bit(found);
+        return true;
+    }
+
+    template <class TMap>
+    TMap remaining() const {
+        TMap result;
+        for (auto entry = list_.begin(); entry != list_.end(); ++entry) {
+            if (!isUsed(entry))
+                result.insert(*entry);
+        }
+        return result;
+    }
+
+  private:
+    using TEntry = typename TParameterList::const_iterator;
+
+    unsigned long long bit(TEntry entry) const { return 1ULL << (entry - list_.begin()); }
+    bool isUsed(TEntry entry) const { return (used_ & bit(entry)) != 0; }
+
+    TParameterList const& list_;
+    unsigned long long used_ = 0;
+};
+
+// True for the classes that override nothing, so that nobody sees the maps of a run. Addresses are
+// enough: a class that is described twice would only take the slower road.
+template <class TMessage>
+bool overridesNothing(TMessage const& message) {
+    std::type_info const* const type = &typeid(message);
+    return type == &typeid(Error::CMessage) || type == &typeid(TMessage) ||
+           type == &typeid(Error::COSErrMessage);
+}
+
 } // namespace
 
 template <class TChar, class TParameterList>
 void CMessage<TChar, TParameterList>::insertParameters(bool addLeftovers) const {
-    TMap all;
-    for (auto const& entry : parameters_)
-        all.emplace(entry.getName(), entry.getValue());
-    TMap remaining = all;
-    doInsertParameters(text_, escapeCharacter, openCharacter, closeCharacter, all, remaining);
+    TMap remaining;
+    if (parameters_.size() <= CListSource<TParameterList>::most && overridesNothing(*this)) {
+        CListSource<TParameterList> source(parameters_);
+        expand_(text_, escapeCharacter, openCharacter, closeCharacter, source);
+        if (addLeftovers)
+            remaining = source.template remaining<TMap>();
+    } else {
+        TMap all;
+        for (auto const& entry : parameters_)
+            all.insert(entry);
+        remaining = all;
+        doInsertParameters(text_, escapeCharacter, openCharacter, closeCharacter, all, remaining);
+    }
     if (addLeftovers && !remaining.empty())
         addLeftoverPars_(text_, remaining);
 }
@@ -52,40 +149,34 @@ template <class TChar, class TParameterList>
 void CMessage<TChar, TParameterList>::doInsertParameters(TText& text, TChar escape,
                                                          TChar const& open, TChar const& close,
                                                          TMap const& all, TMap& remaining) const {
-    TPosition position = findNextParameter_(text, escape, open, 0);
-    while (position != TText::npos) {
-        TPosition const mate = findMate_(text, open, close, position + 1);
-        // What was inserted is scanned in its turn; what stays is left behind by its at sign, so
-        // that a placeholder within its name is still found.
-        bool const replaced =
-            mate != TText::npos && replaceParameter_(text, position, mate, all, remaining);
-        position = findNextParameter_(text, escape, open, replaced ? position : position + 1);
-    }
+    CMapSource<TMap> source(all, remaining);
+    expand_(text, escape, open, close, source);
 }
 
 template <class TChar, class TParameterList>
-bool CMessage<TChar, TParameterList>::replaceParameter_(TText& text, TPosition position,
-                                                        TPosition mate, TMap const& all,
-                                                        TMap& remaining) const {
-    std::string const name = narrowName(text, position + 2, mate);
-    TPosition const length = mate - position + 1;
-    // lower_bound, unlike find, gives the first of several equal names.
-    auto const left = remaining.lower_bound(name);
-    if (left != remaining.end() && left->first == name) {
-        text.replace(position, length, left->second);
-        remaining.erase(left);
-        return true;
+template <class TSource>
+void CMessage<TChar, TParameterList>::expand_(TText& text, TChar escape, TChar const& open,
+                                              TChar const& close, TSource& source) const {
+    TPosition position = findNextParameter_(text, escape, open, 0);
+    while (position != TText::npos) {
+        TPosition next = position + 1;
+        TPosition const mate = findMate_(text, open, close, position + 1);
+        if (mate != TText::npos) {
+            auto const replaceBy = [&](TText const& value) {
+                text.replace(position, mate - position + 1, value);
+                // What was inserted is scanned in its turn; what stays is left behind by its at
+                // sign, so that a placeholder within its name is still found.
+                next = position;
+            };
+            std::string const name = narrowName(text, position + 2, mate);
+            if (!source.use(name, replaceBy)) {
+                TText const offered = findMissingParamter(name);
+                if (!offered.empty())
+                    replaceBy(offered);
+            }
+        }
+        position = findNextParameter_(text, escape, open, next);
     }
-    auto const used = all.lower_bound(name);
-    if (used != all.end() && used->first == name) {
-        text.replace(position, length, used->second);
-        return true;
-    }
-    TText const offered = findMissingParamter(name);
-    if (offered.empty())
-        return false;
-    text.replace(position, length, offered);
-    return true;
 }
 
 // An escaped at sign collapses here, so it happens to each one that the search passes and to no
