@@ -1,5 +1,6 @@
-// A message of three parameters beside other libraries. Each contender gets the values as its own
-// text type or as numbers, owns the text that it makes, and must make the same one.
+// A message of three parameters beside other libraries. Each contender owns the text that it makes
+// and must make the same one. In "texts" and "numbers" it gets values and template as its own text
+// type or as numbers; in "wide" everything comes and goes as std::wstring, as it does here.
 //
 // The template is a value at run time for all of them. Ours and {fmt} read it anew each time, ICU
 // may keep it parsed.
@@ -80,9 +81,9 @@ Strings::CParameterList<wchar_t> parametersOf(TCase const& c) {
 }
 
 template <class TCase>
-void addOurs(TCase const& c) {
+void addOurs(std::string const& row, TCase const& c) {
     using TMessage = Strings::CMessage<wchar_t, Strings::CParameterList<wchar_t>>;
-    addChecked(TCase::row, "ours", c.expected, [c] {
+    addChecked(row, "ours", c.expected, [c] {
         TMessage const message(c.ours, parametersOf(c));
         return message.getString(true);
     });
@@ -90,12 +91,12 @@ void addOurs(TCase const& c) {
 
 #ifdef QORN_HAVE_FMT
 template <class TCase>
-void addFmt(TCase const& c) {
-    addChecked(TCase::row, "fmt", c.expected, [c] {
+void addFmt(std::string const& row, TCase const& c) {
+    addChecked(row, "fmt", c.expected, [c] {
         return fmt::format(fmt::runtime(c.named), fmt::arg(c.wideNames[0], c.first),
                            fmt::arg(c.wideNames[1], c.second), fmt::arg(c.wideNames[2], c.third));
     });
-    addChecked(TCase::row, "fmtdynamic", c.expected, [c] {
+    addChecked(row, "fmtdynamic", c.expected, [c] {
         fmt::dynamic_format_arg_store<fmt::wformat_context> store;
         store.push_back(fmt::arg(c.wideNames[0], c.first));
         store.push_back(fmt::arg(c.wideNames[1], c.second));
@@ -180,16 +181,16 @@ void addQt(CNumbers const& c) {
 #endif
 
 template <class TCase>
-void addBoost(TCase const& c) {
-    addChecked(TCase::row, "boost", c.expected,
+void addBoost(std::string const& row, TCase const& c) {
+    addChecked(row, "boost", c.expected,
                [c] { return (boost::wformat(c.counted) % c.first % c.second % c.third).str(); });
 }
 
 template <class TCase>
 void addCase(TCase const& c) {
-    addOurs(c);
+    addOurs(TCase::row, c);
 #ifdef QORN_HAVE_FMT
-    addFmt(c);
+    addFmt(TCase::row, c);
 #endif
 #ifdef QORN_HAVE_ICU
     addICU(c);
@@ -197,11 +198,44 @@ void addCase(TCase const& c) {
 #ifdef QORN_HAVE_QT
     addQt(c);
 #endif
-    addBoost(c);
+    addBoost(TCase::row, c);
+}
+
+// The values of CTexts, for callers whose texts are wide.
+void addWideCase(CTexts const& c) {
+    std::string const row = "ExpandMessage/wide";
+    addOurs(row, c);
+#ifdef QORN_HAVE_FMT
+    addFmt(row, c);
+#endif
+#ifdef QORN_HAVE_ICU
+    icu::UnicodeString const names[] = {icuText(c.names[0]), icuText(c.names[1]),
+                                        icuText(c.names[2])};
+    UErrorCode status = U_ZERO_ERROR;
+    icu::MessageFormat const parsed(icuPattern(c), status);
+    addChecked(row, "icu", c.expected, [=] {
+        UErrorCode formatStatus = U_ZERO_ERROR;
+        icu::Formattable const values[] = {icuText(c.first), icuText(c.second), icuText(c.third)};
+        icu::UnicodeString result;
+        parsed.format(names, values, 3, result, formatStatus);
+        std::wstring wide(static_cast<std::size_t>(result.length()), L'\0');
+        int32_t const length =
+            result.toUTF32(reinterpret_cast<UChar32*>(&wide[0]), result.length(), formatStatus);
+        wide.resize(static_cast<std::size_t>(length));
+        return wide;
+    });
+#endif
+#ifdef QORN_HAVE_QT
+    addChecked(row, "qt", c.expected, [pattern = qtText(c.countedQt), c] {
+        return pattern.arg(qtText(c.first), qtText(c.second), qtText(c.third)).toStdWString();
+    });
+#endif
+    addBoost(row, c);
 }
 
 void addBenchmarks() {
     addCase(CTexts());
+    addWideCase(CTexts());
     addCase(CNumbers());
 }
 
