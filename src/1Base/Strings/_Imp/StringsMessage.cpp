@@ -2,6 +2,8 @@
 
 #include "1Base/Error/ErrorMessage.h"
 
+#include <algorithm>
+#include <optional>
 #include <typeinfo>
 #include <utility>
 
@@ -12,28 +14,54 @@ constexpr wchar_t escapeCharacter = L'@';
 constexpr wchar_t openCharacter = L'(';
 constexpr wchar_t closeCharacter = L')';
 
-// Names are ASCII as a rule, and then a conversion would be most of an expansion's time.
+// A placeholder's name, while it stands in the text. It is ASCII as a rule, and is then compared as
+// it stands: a conversion would be most of an expansion's time.
 template <class TText>
-std::string narrowName(TText const& text, std::size_t begin, std::size_t end) {
-    std::string narrow(end - begin, '\0');
-    for (std::size_t i = begin; i < end; ++i) {
-        if (static_cast<unsigned long>(text[i]) >= 0x80)
-            return Encoding::convert<std::string>(text.substr(begin, end - begin));
-        narrow[i - begin] = static_cast<char>(text[i]);
+class CName {
+  public:
+    CName(TText const& text, std::size_t begin, std::size_t end)
+        : begin_(text.data() + begin), end_(text.data() + end) {
+        if (!std::all_of(begin_, end_, isASCII))
+            converted_ = Encoding::convert<std::string>(TText(begin_, end_));
     }
-    return narrow;
-}
+
+    bool is(std::string const& other) const {
+        if (converted_)
+            return *converted_ == other;
+        return std::equal(begin_, end_, other.begin(), other.end(), [](TChar wide, char narrow) {
+            return static_cast<unsigned long>(wide) == static_cast<unsigned char>(narrow);
+        });
+    }
+
+    std::string narrow() const {
+        if (converted_)
+            return *converted_;
+        std::string result(static_cast<std::size_t>(end_ - begin_), '\0');
+        std::transform(begin_, end_, result.begin(),
+                       [](TChar wide) { return static_cast<char>(wide); });
+        return result;
+    }
+
+  private:
+    using TChar = typename TText::value_type;
+
+    static bool isASCII(TChar wide) { return static_cast<unsigned long>(wide) < 0x80; }
+
+    TChar const* begin_;
+    TChar const* end_;
+    std::optional<std::string> converted_;
+};
 
 // What a run's placeholders take their values from. `replaceBy` puts a value in the place of the
 // placeholder; only then is the entry used.
-
 template <class TMap>
 class CMapSource {
   public:
     CMapSource(TMap const& all, TMap& remaining) : all_(all), remaining_(remaining) {}
 
-    template <class TReplace>
-    bool use(std::string const& name, TReplace const& replaceBy) {
+    template <class TName, class TReplace>
+    bool use(TName const& placeholder, TReplace const& replaceBy) {
+        std::string const name = placeholder.narrow();
         // lower_bound, unlike find, gives the first of several equal names.
         auto const left = remaining_.lower_bound(name);
         if (left != remaining_.end() && left->first == name) {
@@ -61,11 +89,11 @@ class CListSource {
 
     explicit CListSource(TParameterList const& list) : list_(list) {}
 
-    template <class TReplace>
-    bool use(std::string const& name, TReplace const& replaceBy) {
+    template <class TName, class TReplace>
+    bool use(TName const& name, TReplace const& replaceBy) {
         auto found = list_.end();
         for (auto entry = list_.begin(); entry != list_.end(); ++entry) {
-            if (entry->getName() != name)
+            if (!name.is(entry->getName()))
                 continue;
             if (!isUsed(entry)) {
                 found = entry;
@@ -168,9 +196,9 @@ void CMessage<TChar, TParameterList>::expand_(TText& text, TChar escape, TChar c
                 // sign, so that a placeholder within its name is still found.
                 next = position;
             };
-            std::string const name = narrowName(text, position + 2, mate);
+            CName<TText> const name(text, position + 2, mate);
             if (!source.use(name, replaceBy)) {
-                TText const offered = findMissingParamter(name);
+                TText const offered = findMissingParamter(name.narrow());
                 if (!offered.empty())
                     replaceBy(offered);
             }
