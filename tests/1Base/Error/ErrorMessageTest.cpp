@@ -247,7 +247,7 @@ class CErrorMessageLoaderTest : public CErrorMessageTest {
         CErrorMessageTest::TearDown();
     }
 
-    CLoader const loader_;
+    CLoader const loader_{};
     CMessage::CMessageLoader const* before_ = nullptr;
 };
 
@@ -256,7 +256,7 @@ TEST_F(CErrorMessageLoaderTest, NoneIsInstalledAtFirst) {
 }
 
 TEST_F(CErrorMessageLoaderTest, InstallingReturnsTheOneBefore) {
-    CLoader const other;
+    CLoader const other{};
     EXPECT_EQ(CMessage::setMessageLoader(&other), &loader_);
     EXPECT_EQ(CMessage::setMessageLoader(nullptr), &other);
     EXPECT_EQ(CMessage::setMessageLoader(&loader_), nullptr);

@@ -405,7 +405,7 @@ TEST_F(CStringsParameterListTest, AnObjectWritesItself) {
 }
 
 TEST_F(CStringsParameterListTest, TheAddressOfAValueIsTakenBehindItsOperators) {
-    CAddressless const value;
+    CAddressless const value{};
     EXPECT_EQ(std::addressof(buildNamedParameter("a", value).getValue()), std::addressof(value));
     EXPECT_EQ(describe(buildNamedParameter("a", value)), L"a=addressless\n");
 }
