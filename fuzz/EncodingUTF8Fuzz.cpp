@@ -2,11 +2,11 @@
 // reads as the same text. A byte order mark apart, which only the strict one takes off.
 
 #include "1Base/Encoding/Encoding.h"
+#include "1Base/Error/ErrorException.h"
 
 #include <cstddef>
 #include <cstdint>
 #include <cstdlib>
-#include <exception>
 #include <optional>
 #include <string>
 
@@ -16,7 +16,7 @@ template <class TRead>
 std::optional<Strings::string> accepted(TRead const& read) {
     try {
         return read();
-    } catch (std::exception const&) {
+    } catch (Error::CException const&) {
         return std::nullopt;
     }
 }

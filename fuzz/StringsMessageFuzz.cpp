@@ -37,7 +37,7 @@ std::wstring wide(std::string const& bytes) {
     std::wstring text;
     for (char const byte : bytes) {
         auto const value = static_cast<unsigned char>(byte);
-        bool const isBorder = value >= 0x80 && value - 0x80 < std::size(borders);
+        bool const isBorder = value >= 0x80 && value - 0x80U < std::size(borders);
         text += static_cast<wchar_t>(isBorder ? borders[value - 0x80] : value);
     }
     return text;

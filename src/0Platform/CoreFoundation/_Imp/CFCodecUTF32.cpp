@@ -5,9 +5,9 @@
 // so each number has a road that takes a run of its characters in blocks; a road ends before what
 // is of another kind, and before the last few characters.
 
-#include "0Platform/CoreFoundation/_Imp/CFVector.h"
 #include "0Platform/CoreFoundation/_Imp/CFCursor.h"
 #include "0Platform/CoreFoundation/_Imp/CFUnicode.h"
+#include "0Platform/CoreFoundation/_Imp/CFVector.h"
 
 #include <algorithm>
 

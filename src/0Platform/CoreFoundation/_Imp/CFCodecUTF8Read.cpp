@@ -1,7 +1,7 @@
-#include "0Platform/CoreFoundation/_Imp/CFVector.h"
 #include "0Platform/CoreFoundation/_Imp/CFCodecUTF8.h"
 #include "0Platform/CoreFoundation/_Imp/CFCursor.h"
 #include "0Platform/CoreFoundation/_Imp/CFUnicode.h"
+#include "0Platform/CoreFoundation/_Imp/CFVector.h"
 
 namespace CFPlatform {
 namespace {
