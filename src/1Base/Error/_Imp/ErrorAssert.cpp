@@ -35,8 +35,6 @@ void doThrowAssertionFailedExc(char const* file, unsigned int line, char const* 
 
 } // namespace
 
-void invokeDebugger() {}
-
 namespace Detail {
 
 void throwAssertionFailedExc_(char const* file, unsigned int line, char const* func,
