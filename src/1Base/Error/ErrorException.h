@@ -1,8 +1,7 @@
 /// The root of the exception family, for those who only catch.
 ///
 ///     catch (Error::CException const& exc) {
-///         exc.writeTo(std::cerr, true);   // 'FileSpec': /src/a.cpp # 12, 'f()()', (...):
-///         [SevError] "..."
+///         exc.writeTo(std::cerr, false);   // /src/a.cpp # 12: [SevError] "no folder /tmp/a"
 ///     }
 #ifndef QORN_1BASE_ERROREXCEPTION_H
 #define QORN_1BASE_ERROREXCEPTION_H

@@ -1,11 +1,10 @@
 /// Log records for entering and leaving a scope.
 ///
-///     void convertAll() {
+///     {
 ///         Error::CScopeTracer<TLoggerDemo, Error::TTgtLogger, Error::TSevLog> const tracer(
-///             ERROR_ORIGIN, "convertAll");
-///         ...   // "Entering scope 'convertAll'...", and at the end "Leaving scope
-///         'convertAll'..."
-///     }
+///             ERROR_ORIGIN, "convertAll");   // Entering scope 'convertAll'...
+///         convert(text);
+///     }                                      // Leaving scope 'convertAll'...
 #ifndef QORN_1BASE_ERRORSCOPETRACER_H
 #define QORN_1BASE_ERRORSCOPETRACER_H
 
