@@ -1,5 +1,6 @@
 /// The forms in which code raises, guards, asserts and logs. They supply what a function can't
-/// know by itself: the place in the sources, and the text of an expression.
+/// know by itself: the place in the sources, and the text of an expression. All but the guarded
+/// block and the origin are expressions, also within templates and within other macros' arguments.
 #ifndef QORN_1BASE_ERRORMACROS_H
 #define QORN_1BASE_ERRORMACROS_H
 
@@ -59,19 +60,19 @@
 /// The same with one named parameter, or a list of parameters, for the report.
 ///     ERROR_ASSERT_P(ERROR_PARAM(n), n > 0);
 #define ERROR_ASSERT_P(param, ...)                                                                 \
-    ::Error::Detail::CAsserter_<true, true>::do_assert(ERROR_ORIGIN, (__VA_ARGS__),                \
-                                                       ERROR_TEXT_(__VA_ARGS__), param)
+    (::Error::Detail::CAsserter_<true, true>::do_assert(ERROR_ORIGIN, (__VA_ARGS__),               \
+                                                        ERROR_TEXT_(__VA_ARGS__), param))
 
 /// The same with a text of its own for the expression.
 #define ERROR_ASSERT_TEXT(value, text)                                                             \
-    ::Error::Detail::CAsserter_<true, true>::do_assert(ERROR_ORIGIN, value, text,                  \
-                                                       ::Error::Detail::CAssertDummy())
+    (::Error::Detail::CAsserter_<true, true>::do_assert(ERROR_ORIGIN, value, text,                 \
+                                                        ::Error::Detail::CAssertDummy()))
 
 /// Logs a text, char const* or wchar_t const*, with parameters of any form or none.
 ///     ERROR_LOG(TLoggerFileSys, Error::TTgtLogger, Error::TSevDebug, "copying @(key)",
 ///               ERROR_PARAM(key));
 #define ERROR_LOG(TLogger, TTarget, TSeverity, ...)                                                \
-    TLogger::log<TTarget, TSeverity>(ERROR_ORIGIN, __VA_ARGS__)
+    (TLogger::template log<TTarget, TSeverity>(ERROR_ORIGIN, __VA_ARGS__))
 
 #define ERROR_TEXT_(...) #__VA_ARGS__
 
