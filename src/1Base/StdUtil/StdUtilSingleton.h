@@ -4,7 +4,7 @@
 ///
 /// `get` takes no lock: the first call for a type must not race with another one. Once it has
 /// returned, calls are safe on any thread. No instance is destroyed when the process ends, so one
-/// may be used while other static objects are.
+/// may be used, and even made, while other static objects are destroyed.
 #ifndef QORN_1BASE_STDUTILSINGLETON_H
 #define QORN_1BASE_STDUTILSINGLETON_H
 
@@ -110,8 +110,7 @@ class CSingleton {
         return singleton_;
     }
 
-    /// All instances made so far, of all types. The list frees its own storage at exit and leaves
-    /// the instances alone.
+    /// All instances made so far, of all types.
     static std::vector<Detail::CSingletonWrapperBase*>& getSingletons();
 
     template <class TSingleton>

@@ -126,10 +126,10 @@ TEST_F(CStreamLogTargetTest, ALogCallArrives) {
     std::ostringstream stream;
     CStreamLogTarget const target(stream);
     CInstalledTarget<Error::TTgtLogger, Error::TSevWarn> const installed(target);
+    using Error::TLoggerError, Error::TTgtLogger, Error::TSevWarn;
     int const count = 3;
     unsigned int const line = __LINE__ + 1;
-    ERROR_LOG(Error::TLoggerError, Error::TTgtLogger, Error::TSevWarn, "@(count) left",
-              ERROR_PARAM(count));
+    ERROR_LOG(TLoggerError, TTgtLogger, TSevWarn, "@(count) left", ERROR_PARAM(count));
     EXPECT_EQ(stream.str(), std::string("[SevWarn] Error: 3 left (") + __FILE__ + " #" +
                                 std::to_string(line) + ")\n");
 }

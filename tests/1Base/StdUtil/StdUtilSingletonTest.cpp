@@ -188,7 +188,7 @@ class CLoud {
 };
 
 TEST_F(CStdUtilSingletonTest, NoInstanceIsDestroyedWhenTheProcessEnds) {
-    // An ordinary static object is, and sees the singleton still in its place.
+    // An ordinary static object is, and finds the singleton still in its place.
     auto const end = [] {
         class CObserver {
           public:
@@ -200,6 +200,24 @@ TEST_F(CStdUtilSingletonTest, NoInstanceIsDestroyedWhenTheProcessEnds) {
         std::exit(0);
     };
     EXPECT_EXIT(end(), testing::ExitedWithCode(0), "^made alive$");
+}
+
+TEST_F(CStdUtilSingletonTest, AnInstanceMayBeMadeWhileOtherStaticObjectsAreDestroyed) {
+    auto const end = [] {
+        class CMaker {
+          public:
+            ~CMaker() {
+                std::size_t const before = CSingleton::getSingletons().size();
+                CSingleton::get<CLoud>();
+                say(CSingleton::getSingletons().size() == before + 1 ? "listed" : "lost");
+            }
+        };
+        // Made before the list, and so destroyed after all that the list's own end could do.
+        static CMaker const maker;
+        CSingleton::get<CCounted<9>>();
+        std::exit(0);
+    };
+    EXPECT_EXIT(end(), testing::ExitedWithCode(0), "^made listed$");
 }
 
 class CFailsAtEnd {

@@ -3,7 +3,8 @@
 namespace StdUtil {
 
 std::vector<Detail::CSingletonWrapperBase*>& CSingleton::getSingletons() {
-    static std::vector<Detail::CSingletonWrapperBase*> singletons_;
+    // Never destroyed: the first call for a type may come while other static objects go.
+    static auto& singletons_ = *new std::vector<Detail::CSingletonWrapperBase*>;
     return singletons_;
 }
 
