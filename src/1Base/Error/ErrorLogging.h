@@ -21,6 +21,7 @@
 #include <boost/thread/lock_types.hpp>
 #include <boost/thread/mutex.hpp>
 
+#include <utility>
 #include <vector>
 
 namespace Error {
@@ -80,8 +81,10 @@ class CLogSingleton {
         Detail::TLogTargetList const& list = getTargetList_<TTarget, TSeverity>();
         if (list.empty())
             return;
-        dolog<TTag, TTarget, TSeverity>(list, file, line, func, date, time, text,
-                                        Strings::CParameterList<wchar_t>(params));
+        Strings::CParameterList<wchar_t> owned;
+        owned.reserve(Strings::parameterCount(params) + 1); // the text joins them
+        owned.add(params);
+        dolog<TTag, TTarget, TSeverity>(list, file, line, func, date, time, text, std::move(owned));
     }
 
     template <class TTarget, class TSeverity>
@@ -96,21 +99,22 @@ class CLogSingleton {
     template <class TTag, class TTarget, class TSeverity, class TChar>
     static void dolog(Detail::TLogTargetList const& list, char const* file, unsigned int line,
                       char const* func, char const* date, char const* time, TChar const* text,
-                      Strings::CParameterList<wchar_t> const& params) {
+                      Strings::CParameterList<wchar_t>&& params) {
         if (!list.empty())
             write_(list, file, line, func, date, time, TemplMeta::getTagName<TTag>(),
                    TemplMeta::getTagName<TTarget>(), TemplMeta::getTagName<TSeverity>(), text,
-                   params);
+                   std::move(params));
     }
 
+    // The parameters are used up.
     static void write_(Detail::TLogTargetList const& list, char const* file, unsigned int line,
                        char const* func, char const* date, char const* time, char const* tag,
                        char const* target, char const* severity, char const* text,
-                       Strings::CParameterList<wchar_t> const& params);
+                       Strings::CParameterList<wchar_t>&& params);
     static void write_(Detail::TLogTargetList const& list, char const* file, unsigned int line,
                        char const* func, char const* date, char const* time, char const* tag,
                        char const* target, char const* severity, wchar_t const* text,
-                       Strings::CParameterList<wchar_t> const& params);
+                       Strings::CParameterList<wchar_t>&& params);
 
     static void addTarget_(Detail::TLogTargetList& list, CLogTarget const* target);
     static bool removeTarget_(Detail::TLogTargetList& list, CLogTarget const* target);

@@ -80,6 +80,8 @@ class CParameterList {
         add(std::string(parameter.getName()), parameter.getValue());
     }
 
+    void add(TemplMeta::CNil) {}
+
     /// All elements in list order, with one growth at most.
     template <class THead, class TTail>
     void add(TemplMeta::CObjList<THead, TTail> const& list) {
@@ -130,6 +132,26 @@ class CParameterList {
 };
 
 extern template class CParameterList<wchar_t>;
+
+/// The number of parameters in any of their forms.
+template <class T>
+constexpr std::size_t parameterCount(CStaticNamedParameter<T> const&) {
+    return 1;
+}
+
+template <class THead, class TTail>
+constexpr std::size_t parameterCount(TemplMeta::CObjList<THead, TTail> const& list) {
+    return TemplMeta::listSize(list);
+}
+
+constexpr std::size_t parameterCount(TemplMeta::CNil) {
+    return 0;
+}
+
+template <class TChar>
+std::size_t parameterCount(CParameterList<TChar> const& list) {
+    return list.size();
+}
 
 /// A copy of the list with the parameter behind it.
 template <class TChar, class T>

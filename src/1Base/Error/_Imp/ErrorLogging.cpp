@@ -1,6 +1,8 @@
 #include "1Base/Error/ErrorLogging.h"
 
 #include <algorithm>
+#include <iterator>
+#include <utility>
 
 namespace Error {
 namespace {
@@ -10,11 +12,15 @@ template <class TText>
 void writeToTargets(Detail::TLogTargetList const& list, char const* file, unsigned int line,
                     char const* func, char const* date, char const* time, char const* tag,
                     char const* target, char const* severity, TText const& text,
-                    Strings::CParameterList<wchar_t> const& params) {
-    for (CLogTarget const* const each : list)
-        each->write(
-            file, line, func, date, time, tag, target, severity,
-            CMessage(msgPlainMessage, params + Strings::buildNamedParameter("__msg__", text)));
+                    Strings::CParameterList<wchar_t>&& params) {
+    params.add(Strings::buildNamedParameter("__msg__", text));
+    auto const write = [&](CLogTarget const& each, CMessage const& message) {
+        each.write(file, line, func, date, time, tag, target, severity, message);
+    };
+    auto const last = std::prev(list.end());
+    for (auto each = list.begin(); each != last; ++each)
+        write(**each, CMessage(msgPlainMessage, params));
+    write(**last, CMessage(msgPlainMessage, std::move(params)));
 }
 
 } // namespace
@@ -28,15 +34,17 @@ boost::mutex& CLogSingleton::mutex_() {
 void CLogSingleton::write_(Detail::TLogTargetList const& list, char const* file, unsigned int line,
                            char const* func, char const* date, char const* time, char const* tag,
                            char const* target, char const* severity, char const* text,
-                           Strings::CParameterList<wchar_t> const& params) {
-    writeToTargets(list, file, line, func, date, time, tag, target, severity, text, params);
+                           Strings::CParameterList<wchar_t>&& params) {
+    writeToTargets(list, file, line, func, date, time, tag, target, severity, text,
+                   std::move(params));
 }
 
 void CLogSingleton::write_(Detail::TLogTargetList const& list, char const* file, unsigned int line,
                            char const* func, char const* date, char const* time, char const* tag,
                            char const* target, char const* severity, wchar_t const* text,
-                           Strings::CParameterList<wchar_t> const& params) {
-    writeToTargets(list, file, line, func, date, time, tag, target, severity, text, params);
+                           Strings::CParameterList<wchar_t>&& params) {
+    writeToTargets(list, file, line, func, date, time, tag, target, severity, text,
+                   std::move(params));
 }
 
 void CLogSingleton::addTarget_(Detail::TLogTargetList& list, CLogTarget const* target) {
