@@ -36,21 +36,24 @@ class Reader : private DecodeCursor {
 
   private:
     void readOnes() {
-        for (CFIndex good = 8; good == 8 && has(32); advance(4 * good, good)) {
+        for (; has(32); advance(32, 8)) {
             auto const front = load<Words4>(bytes);
             auto const back = load<Words4>(bytes + 16);
             Units8 const block = lowHalves(front, back);
             store(units, block);
-            good = clearLanes(highHalves(front, back) | surrogates(block));
+            CFIndex const good = clearLanes(highHalves(front, back) | surrogates(block));
+            if (good < 8)
+                return advance(4 * good, good);
         }
     }
 
     void readPairs() {
-        for (CFIndex good = 4; good == 4 && has(16) && load<UInt32>(bytes) > 0xFFFFU;
-             advance(4 * good, 2 * good)) {
+        for (; has(16) && load<UInt32>(bytes) > 0xFFFFU; advance(16, 8)) {
             Words4 const beyond = load<Words4>(bytes) - 0x10000;
             store(units, splitPairs(beyond));
-            good = clearLanes(beyond >> 20);
+            CFIndex const good = clearLanes(beyond >> 20);
+            if (good < 4)
+                return advance(4 * good, 2 * good);
         }
     }
 };
@@ -78,20 +81,23 @@ class Writer : private EncodeCursor {
 
   private:
     void writeOnes() {
-        for (CFIndex good = 8; good == 8 && has(8, 32); advance(good, 4 * good)) {
+        for (; has(8, 32); advance(8, 32)) {
             auto const block = load<Units8>(units);
             store(bytes, widenFront(block));
             store(bytes + 16, widenBack(block));
-            good = clearLanes(surrogates(block));
+            CFIndex const good = clearLanes(surrogates(block));
+            if (good < 8)
+                return advance(good, 4 * good);
         }
     }
 
     void writePairs() {
-        for (CFIndex good = 4; good == 4 && has(8, 16) && isHighSurrogate(units[0]);
-             advance(2 * good, 4 * good)) {
+        for (; has(8, 16) && isHighSurrogate(units[0]); advance(8, 16)) {
             auto const pairs = load<Words4>(units);
             store(bytes, joinPairs(pairs));
-            good = clearLanes(wrongPairs(pairs));
+            CFIndex const good = clearLanes(wrongPairs(pairs));
+            if (good < 4)
+                return advance(2 * good, 4 * good);
         }
     }
 };

@@ -128,25 +128,30 @@ class Reader : private DecodeCursor {
     }
 
     void readThrees() {
-        for (CFIndex good = 8; good == 8 && startsRun(24, 3, 0xE0); advance(3 * good, good)) {
+        for (; startsRun(24, 3, 0xE0); advance(24, 8)) {
             auto const at = [this](CFIndex index) { return load<UInt16>(bytes + index); };
             Units8 const front = {at(0), at(3), at(6), at(9), at(12), at(15), at(18), at(21)};
             Units8 const back = {at(1), at(4), at(7), at(10), at(13), at(16), at(19), at(22)};
             Units8 const block = front << 12 | (front >> 2 & 0xFC0) | (back >> 8 & 0x3F);
             store(units, block);
-            good = clearLanes(((front & 0xC0F0) ^ 0x80E0) | ((back & 0xC000) ^ 0x8000) |
-                              zero(block & 0xF800) | surrogates(block));
+            CFIndex const good =
+                clearLanes(((front & 0xC0F0) ^ 0x80E0) | ((back & 0xC000) ^ 0x8000) |
+                           zero(block & 0xF800) | surrogates(block));
+            if (good < 8)
+                return advance(3 * good, good);
         }
     }
 
     void readFours() {
-        for (CFIndex good = 4; good == 4 && startsRun(16, 4, 0xF0); advance(4 * good, 2 * good)) {
+        for (; startsRun(16, 4, 0xF0); advance(16, 8)) {
             auto const quads = load<Words4>(bytes);
             Words4 const beyond = ((quads & 0x07) << 18 | (quads & 0x3F00) << 4 |
                                    (quads >> 10 & 0xFC0) | (quads >> 24 & 0x3F)) -
                                   0x10000;
             store(units, splitPairs(beyond));
-            good = clearLanes(((quads & 0xC0C0C0F8U) ^ 0x808080F0U) | beyond >> 20);
+            CFIndex const good = clearLanes(((quads & 0xC0C0C0F8U) ^ 0x808080F0U) | beyond >> 20);
+            if (good < 4)
+                return advance(4 * good, 2 * good);
         }
     }
 };

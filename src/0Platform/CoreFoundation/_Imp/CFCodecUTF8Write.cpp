@@ -89,8 +89,7 @@ class Writer : private EncodeCursor {
     }
 
     void writeThrees() {
-        for (CFIndex good = 8; good == 8 && has(8, 24) && startsRun(0x800);
-             advance(good, 3 * good)) {
+        for (; has(8, 24) && startsRun(0x800); advance(8, 24)) {
             auto const block = load<Units8>(units);
             Words4 const triples[2] = {triplesOf(widenFront(block)), triplesOf(widenBack(block))};
             for (int i = 0; i < 7; ++i)
@@ -98,7 +97,9 @@ class Writer : private EncodeCursor {
             // A fourth byte here would be one too many.
             store(bytes + 21, static_cast<UInt16>(triples[1][3]));
             bytes[23] = static_cast<UInt8>(triples[1][3] >> 16);
-            good = clearLanes(zero(block & 0xF800) | surrogates(block));
+            CFIndex const good = clearLanes(zero(block & 0xF800) | surrogates(block));
+            if (good < 8)
+                return advance(good, 3 * good);
         }
     }
 
@@ -107,13 +108,14 @@ class Writer : private EncodeCursor {
     }
 
     void writeFours() {
-        for (CFIndex good = 4; good == 4 && has(8, 16) && startsRun(0xD800);
-             advance(2 * good, 4 * good)) {
+        for (; has(8, 16) && startsRun(0xD800); advance(8, 16)) {
             auto const pairs = load<Words4>(units);
             Words4 const words = joinPairs(pairs);
             store(bytes, 0x808080F0U | words >> 18 | (words >> 4 & 0x3F00) |
                              (words << 10 & 0x3F0000) | (words & 0x3F) << 24);
-            good = clearLanes(wrongPairs(pairs));
+            CFIndex const good = clearLanes(wrongPairs(pairs));
+            if (good < 4)
+                return advance(2 * good, 4 * good);
         }
     }
 

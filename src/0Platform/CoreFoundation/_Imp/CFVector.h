@@ -97,14 +97,6 @@ inline CFIndex clearBytes(std::uint64_t tops) {
     return tops == 0 ? 8 : __builtin_ctzll(tops) / 8;
 }
 
-/// The same for sixteen, of which at least one is marked. In mixed text it is anyone's guess where
-/// that is, so this does not branch.
-inline CFIndex clearBytes(std::uint64_t frontTops, std::uint64_t backTops) {
-    std::uint64_t const frontIsClear = 0U - static_cast<std::uint64_t>(frontTops == 0);
-    std::uint64_t const tops = frontTops | (backTops & frontIsClear);
-    return static_cast<CFIndex>(8 & frontIsClear) + __builtin_ctzll(tops) / 8;
-}
-
 /// How many lanes stand in front of the first one that is not zero.
 inline CFIndex clearLanes(Units8 block) {
     return clearBytes(topBits(block));
