@@ -311,20 +311,20 @@ class CRandomText {
     std::mt19937 random_;
 };
 
-TBytes utf8Of(TCodePoints const& text) {
+TBytes bytesOf(TCodePoints const& text, TBytes (*bytesOfCodePoint)(UInt32)) {
     TBytes bytes;
     for (UInt32 const codePoint : text)
-        for (UInt8 const byte : utf8OfCodePoint(codePoint))
+        for (UInt8 const byte : bytesOfCodePoint(codePoint))
             bytes.push_back(byte);
     return bytes;
 }
 
+TBytes utf8Of(TCodePoints const& text) {
+    return bytesOf(text, utf8OfCodePoint);
+}
+
 TBytes utf32Of(TCodePoints const& text) {
-    TBytes bytes;
-    for (UInt32 const codePoint : text)
-        for (UInt8 const byte : utf32OfCodePoint(codePoint))
-            bytes.push_back(byte);
-    return bytes;
+    return bytesOf(text, utf32OfCodePoint);
 }
 
 TUnits utf16Of(TCodePoints const& text) {
