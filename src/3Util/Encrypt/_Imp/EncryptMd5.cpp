@@ -1,0 +1,179 @@
+// MD5 as RFC 1321 has it.
+
+#include "3Util/Encrypt/EncryptMd5.h"
+
+#include <algorithm>
+#include <cstdint>
+#include <cstring>
+#include <new>
+
+namespace Encrypt {
+namespace {
+
+constexpr std::size_t blockBytes = 64;
+
+struct MD5_CTX {
+    std::uint32_t state[4];
+    std::uint64_t count; // of bits
+    unsigned char buffer[blockBytes];
+};
+
+static_assert(sizeof(MD5_CTX) == 88, "the context fills the creator's room");
+
+// Bytes are little-endian words; both conversions compile to plain moves where the machine agrees.
+std::uint32_t loadWord(unsigned char const* bytes) {
+    return static_cast<std::uint32_t>(bytes[0]) | static_cast<std::uint32_t>(bytes[1]) << 8 |
+           static_cast<std::uint32_t>(bytes[2]) << 16 | static_cast<std::uint32_t>(bytes[3]) << 24;
+}
+
+template <class TWord>
+void storeWord(unsigned char* bytes, TWord word) {
+    for (std::size_t i = 0; i < sizeof(word); ++i)
+        bytes[i] = static_cast<unsigned char>(word >> (8 * i));
+}
+
+constexpr std::uint32_t rotate(std::uint32_t value, unsigned int bits) {
+    return value << bits | value >> (32 - bits);
+}
+
+// The four auxiliary functions. G's two halves share no bit, so they may be added, and the
+// addition of the first half need not wait for the second.
+struct F {
+    static std::uint32_t mix(std::uint32_t sum, std::uint32_t x, std::uint32_t y, std::uint32_t z) {
+        return sum + (z ^ (x & (y ^ z)));
+    }
+};
+
+struct G {
+    static std::uint32_t mix(std::uint32_t sum, std::uint32_t x, std::uint32_t y, std::uint32_t z) {
+        return sum + (y & ~z) + (x & z);
+    }
+};
+
+struct H {
+    static std::uint32_t mix(std::uint32_t sum, std::uint32_t x, std::uint32_t y, std::uint32_t z) {
+        return sum + (x ^ (y ^ z));
+    }
+};
+
+struct I {
+    static std::uint32_t mix(std::uint32_t sum, std::uint32_t x, std::uint32_t y, std::uint32_t z) {
+        return sum + (y ^ (x | ~z));
+    }
+};
+
+template <class TFunction, unsigned int bits>
+inline void step(std::uint32_t& a, std::uint32_t b, std::uint32_t c, std::uint32_t d,
+                 std::uint32_t word, std::uint32_t constant) {
+    a = b + rotate(TFunction::mix(a + word + constant, b, c, d), bits);
+}
+
+// Four steps of a round: words k, k + stride, ... (mod 16), with the round's four rotations.
+template <class TFunction, unsigned int s1, unsigned int s2, unsigned int s3, unsigned int s4>
+inline void fourSteps(std::uint32_t (&v)[4], std::uint32_t const (&x)[16], unsigned int k,
+                      unsigned int stride, std::uint32_t const* constants) {
+    step<TFunction, s1>(v[0], v[1], v[2], v[3], x[k & 15], constants[0]);
+    step<TFunction, s2>(v[3], v[0], v[1], v[2], x[(k + stride) & 15], constants[1]);
+    step<TFunction, s3>(v[2], v[3], v[0], v[1], x[(k + 2 * stride) & 15], constants[2]);
+    step<TFunction, s4>(v[1], v[2], v[3], v[0], x[(k + 3 * stride) & 15], constants[3]);
+}
+
+// floor(2^32 * abs(sin(i + 1))).
+constexpr std::uint32_t sines[64] = {
+    0xd76aa478, 0xe8c7b756, 0x242070db, 0xc1bdceee, 0xf57c0faf, 0x4787c62a, 0xa8304613, 0xfd469501,
+    0x698098d8, 0x8b44f7af, 0xffff5bb1, 0x895cd7be, 0x6b901122, 0xfd987193, 0xa679438e, 0x49b40821,
+    0xf61e2562, 0xc040b340, 0x265e5a51, 0xe9b6c7aa, 0xd62f105d, 0x02441453, 0xd8a1e681, 0xe7d3fbc8,
+    0x21e1cde6, 0xc33707d6, 0xf4d50d87, 0x455a14ed, 0xa9e3e905, 0xfcefa3f8, 0x676f02d9, 0x8d2a4c8a,
+    0xfffa3942, 0x8771f681, 0x6d9d6122, 0xfde5380c, 0xa4beea44, 0x4bdecfa9, 0xf6bb4b60, 0xbebfbc70,
+    0x289b7ec6, 0xeaa127fa, 0xd4ef3085, 0x04881d05, 0xd9d4d039, 0xe6db99e5, 0x1fa27cf8, 0xc4ac5665,
+    0xf4292244, 0x432aff97, 0xab9423a7, 0xfc93a039, 0x655b59c3, 0x8f0ccc92, 0xffeff47d, 0x85845dd1,
+    0x6fa87e4f, 0xfe2ce6e0, 0xa3014314, 0x4e0811a1, 0xf7537e82, 0xbd3af235, 0x2ad7d2bb, 0xeb86d391};
+
+void MD5Transform(std::uint32_t (&state)[4], unsigned char const* block) {
+    std::uint32_t x[16];
+    for (unsigned int i = 0; i < 16; ++i)
+        x[i] = loadWord(block + 4 * i);
+    std::uint32_t v[4] = {state[0], state[1], state[2], state[3]};
+    for (unsigned int i = 0; i < 4; ++i)
+        fourSteps<F, 7, 12, 17, 22>(v, x, 4 * i, 1, sines + 4 * i);
+    for (unsigned int i = 0; i < 4; ++i)
+        fourSteps<G, 5, 9, 14, 20>(v, x, 1 + 20 * i, 5, sines + 16 + 4 * i);
+    for (unsigned int i = 0; i < 4; ++i)
+        fourSteps<H, 4, 11, 16, 23>(v, x, 5 + 12 * i, 3, sines + 32 + 4 * i);
+    for (unsigned int i = 0; i < 4; ++i)
+        fourSteps<I, 6, 10, 15, 21>(v, x, 28 * i, 7, sines + 48 + 4 * i);
+    for (unsigned int i = 0; i < 4; ++i)
+        state[i] += v[i];
+}
+
+void MD5Init(MD5_CTX& context) {
+    context.state[0] = 0x67452301;
+    context.state[1] = 0xefcdab89;
+    context.state[2] = 0x98badcfe;
+    context.state[3] = 0x10325476;
+}
+
+void MD5Update(MD5_CTX& context, unsigned char const* data, unsigned long length) {
+    std::size_t const held = static_cast<std::size_t>(context.count / 8 % blockBytes);
+    context.count += static_cast<std::uint64_t>(length) * 8;
+    if (held != 0) {
+        std::size_t const wanted = std::min<std::size_t>(blockBytes - held, length);
+        std::memcpy(context.buffer + held, data, wanted);
+        if (held + wanted < blockBytes)
+            return;
+        MD5Transform(context.state, context.buffer);
+        data += wanted;
+        length -= wanted;
+    }
+    for (; length >= blockBytes; data += blockBytes, length -= blockBytes)
+        MD5Transform(context.state, data);
+    if (length != 0)
+        std::memcpy(context.buffer, data, length);
+}
+
+void MD5Final(TMd5Digest& digest, MD5_CTX& context) {
+    static constexpr unsigned char padding[blockBytes] = {0x80};
+    unsigned char bits[8];
+    storeWord(bits, context.count);
+    std::size_t const held = static_cast<std::size_t>(context.count / 8 % blockBytes);
+    MD5Update(context, padding, (held < 56 ? 56 : 120) - held);
+    MD5Update(context, bits, sizeof(bits));
+    for (std::size_t i = 0; i < 4; ++i)
+        storeWord(digest.data() + 4 * i, context.state[i]);
+}
+
+MD5_CTX& contextOf(boost::array<unsigned char, 88>& room) {
+    return *std::launder(reinterpret_cast<MD5_CTX*>(room.data()));
+}
+
+} // namespace
+
+CMd5Creator::CMd5Creator(TMd5Digest& digest) : digest_(digest) {
+    static_assert(alignof(MD5_CTX) <= 8, "the creator's room is aligned for the context");
+    MD5Init(*new (context_.data()) MD5_CTX());
+}
+
+CMd5Creator::~CMd5Creator() {
+    MD5Final(digest_, contextOf(context_));
+}
+
+void CMd5Creator::process(unsigned char const* data, unsigned long length) {
+    if (length != 0)
+        MD5Update(contextOf(context_), data, length);
+}
+
+void CMd5Creator::process(char const* text) {
+    process(reinterpret_cast<unsigned char const*>(text),
+            static_cast<unsigned long>(std::strlen(text) + 1));
+}
+
+void CMd5Creator::process(TByteVector const& data) {
+    process(data.data(), static_cast<unsigned long>(data.size()));
+}
+
+void CMd5Creator::process(std::string const& text) {
+    process(reinterpret_cast<unsigned char const*>(text.data()),
+            static_cast<unsigned long>(text.size()));
+}
+
+} // namespace Encrypt
