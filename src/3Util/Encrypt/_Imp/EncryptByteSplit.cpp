@@ -9,7 +9,7 @@
 namespace Encrypt {
 namespace {
 
-constexpr std::size_t bitsPerByte = 8;
+constexpr unsigned int bitsPerByte = 8;
 constexpr std::size_t bytesPerWord = sizeof(std::uint64_t);
 
 // What is read next and what is written next.
@@ -62,9 +62,10 @@ struct CStep {
     static std::uint64_t join(std::uint64_t word) { return (word & lower) | (word & upper) >> gap; }
 };
 
-// The bytes of a block stand at the upper end of a word.
-template <unsigned int bits>
-constexpr unsigned int freeBits = 64 - bitsPerByte* bits;
+// The bytes of a block stand at the upper end of a word, above these bits.
+constexpr unsigned int freeBits(unsigned int bits) {
+    return 64 - bits * bitsPerByte;
+}
 
 template <unsigned int bits>
 struct CSplitBlock {
@@ -72,10 +73,19 @@ struct CSplitBlock {
     static constexpr std::size_t targetBytes = bytesPerWord;
 
     static std::uint64_t repack(std::uint64_t word) {
-        word >>= freeBits<bits>;
+        word >>= freeBits(bits);
         return CStep<bits, 8>::part(CStep<bits, 16>::part(CStep<bits, 32>::part(word)));
     }
 };
+
+// For single bits there is a shorter way: each byte of the word gets a copy of them and keeps one.
+template <>
+std::uint64_t CSplitBlock<1>::repack(std::uint64_t word) {
+    std::uint64_t const everyByte = 0x0101010101010101;
+    std::uint64_t const kept = (word >> freeBits(1)) * everyByte & 0x8040201008040201;
+    // Wherever the kept bit is set, the addition carries it into the highest.
+    return (kept + 0x7F * everyByte) >> 7 & everyByte;
+}
 
 template <unsigned int bits>
 struct CMergeBlock {
@@ -84,7 +94,7 @@ struct CMergeBlock {
 
     static std::uint64_t repack(std::uint64_t word) {
         word = CStep<bits, 32>::join(CStep<bits, 16>::join(CStep<bits, 8>::join(word)));
-        return word << freeBits<bits>;
+        return word << freeBits(bits);
     }
 };
 
