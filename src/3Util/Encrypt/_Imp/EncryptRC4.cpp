@@ -1,30 +1,34 @@
 #include "3Util/Encrypt/EncryptRC4.h"
 
+#include <boost/endian/conversion.hpp>
+
 #include <cstdint>
 #include <utility>
 
 namespace Encrypt {
 
-// The permutation's bytes stand in whole words: the processor reads and writes those faster than
-// single bytes.
 struct CRC4::rc4_key {
-    std::uint32_t s[256];
-    std::uint32_t x = 0;
-    std::uint32_t y = 0;
+    unsigned char s[256];
+    unsigned char x = 0;
+    unsigned char y = 0;
+
+    rc4_key(unsigned char const* key, unsigned long length);
 };
 
-CRC4::CRC4(unsigned char const* key, unsigned long length) : key_(std::make_unique<rc4_key>()) {
-    std::uint32_t(&s)[256] = key_->s;
-    for (std::uint32_t i = 0; i < 256; ++i)
-        s[i] = i;
-    std::uint32_t j = 0;
+CRC4::rc4_key::rc4_key(unsigned char const* key, unsigned long length) {
+    for (unsigned int i = 0; i < 256; ++i)
+        s[i] = static_cast<unsigned char>(i);
+    unsigned char j = 0;
     unsigned long k = 0;
-    for (std::uint32_t i = 0; i < 256; ++i) {
-        j = (key[k] + j + s[i]) & 0xFF;
+    for (unsigned int i = 0; i < 256; ++i) {
+        j = static_cast<unsigned char>(key[k] + j + s[i]);
         std::swap(s[i], s[j]);
         k = (k + 1) % length;
     }
 }
+
+CRC4::CRC4(unsigned char const* key, unsigned long length)
+    : key_(std::make_unique<rc4_key>(key, length)) {}
 
 CRC4::CRC4(TByteVector const& key) : CRC4(key.data(), static_cast<unsigned long>(key.size())) {}
 
@@ -35,18 +39,30 @@ CRC4::CRC4(std::string const& key)
 CRC4::~CRC4() = default;
 
 unsigned char* CRC4::process(unsigned char* data, unsigned long length) const {
-    std::uint32_t(&s)[256] = key_->s;
-    std::uint32_t x = key_->x;
-    std::uint32_t y = key_->y;
-    for (unsigned long i = 0; i < length; ++i) {
-        x = (x + 1) & 0xFF;
-        std::uint32_t const sx = s[x];
-        y = (y + sx) & 0xFF;
-        std::uint32_t const sy = s[y];
+    unsigned char(&s)[256] = key_->s;
+    unsigned char x = key_->x;
+    unsigned char y = key_->y;
+    auto const nextByte = [&s, &x, &y] {
+        unsigned char const sx = s[++x];
+        y = static_cast<unsigned char>(y + sx);
+        unsigned char const sy = s[y];
         s[x] = sy;
         s[y] = sx;
-        data[i] = static_cast<unsigned char>(data[i] ^ s[(sx + sy) & 0xFF]);
-    }
+        return s[static_cast<unsigned char>(sx + sy)];
+    };
+    auto const nextWord = [&nextByte] {
+        std::uint64_t word = 0;
+        for (unsigned int shift = 0; shift < 64; shift += 8)
+            word |= static_cast<std::uint64_t>(nextByte()) << shift;
+        return word;
+    };
+
+    unsigned char* rest = data;
+    for (; length >= 8; length -= 8, rest += 8)
+        boost::endian::store_little_u64(rest, boost::endian::load_little_u64(rest) ^ nextWord());
+    for (; length != 0; --length, ++rest)
+        *rest = static_cast<unsigned char>(*rest ^ nextByte());
+
     key_->x = x;
     key_->y = y;
     return data;
