@@ -23,7 +23,10 @@ CRC4::rc4_key::rc4_key(unsigned char const* key, unsigned long length) {
     for (unsigned int i = 0; i < 256; ++i) {
         j = static_cast<unsigned char>(key[k] + j + s[i]);
         std::swap(s[i], s[j]);
-        k = (k + 1) % length;
+        // The division would take most of the time, and is needed at the key's end alone.
+        ++k;
+        if (k >= length)
+            k %= length;
     }
 }
 
