@@ -2,9 +2,12 @@
 
 #include "3Util/Encrypt/EncryptMd5.h"
 
+#include <boost/endian/conversion.hpp>
+
 #include <algorithm>
 #include <cstdint>
 #include <cstring>
+#include <iterator>
 #include <new>
 
 namespace Encrypt {
@@ -20,44 +23,41 @@ struct MD5_CTX {
 
 static_assert(sizeof(MD5_CTX) == 88, "the context fills the creator's room");
 
-// Bytes are little-endian words; both conversions compile to plain moves where the machine agrees.
-std::uint32_t loadWord(unsigned char const* bytes) {
-    return static_cast<std::uint32_t>(bytes[0]) | static_cast<std::uint32_t>(bytes[1]) << 8 |
-           static_cast<std::uint32_t>(bytes[2]) << 16 | static_cast<std::uint32_t>(bytes[3]) << 24;
-}
-
-template <class TWord>
-void storeWord(unsigned char* bytes, TWord word) {
-    for (std::size_t i = 0; i < sizeof(word); ++i)
-        bytes[i] = static_cast<unsigned char>(word >> (8 * i));
-}
-
 constexpr std::uint32_t rotate(std::uint32_t value, unsigned int bits) {
     return value << bits | value >> (32 - bits);
 }
 
-// The four auxiliary functions. G's two halves share no bit, so they may be added, and the
-// addition of the first half need not wait for the second.
+// Each step waits for the one before, so what counts is the way from its `b` to the next. A sum of
+// what is known earlier is kept together: compilers would regroup it and add the constant last.
+inline std::uint32_t keepTogether(std::uint32_t sum) {
+#ifdef __GNUC__
+    __asm__("" : "+r"(sum));
+#endif
+    return sum;
+}
+
+// The four auxiliary functions, added to a sum; `x` is known last. G's two halves share no bit, so
+// that they may be added one by one.
 struct F {
-    static std::uint32_t mix(std::uint32_t sum, std::uint32_t x, std::uint32_t y, std::uint32_t z) {
+    static std::uint32_t add(std::uint32_t sum, std::uint32_t x, std::uint32_t y, std::uint32_t z) {
         return sum + (z ^ (x & (y ^ z)));
     }
 };
 
 struct G {
-    static std::uint32_t mix(std::uint32_t sum, std::uint32_t x, std::uint32_t y, std::uint32_t z) {
-        return sum + (y & ~z) + (x & z);
+    static std::uint32_t add(std::uint32_t sum, std::uint32_t x, std::uint32_t y, std::uint32_t z) {
+        return keepTogether(sum + (y & ~z)) + (x & z);
     }
 };
 
 struct H {
-    static std::uint32_t mix(std::uint32_t sum, std::uint32_t x, std::uint32_t y, std::uint32_t z) {
+    static std::uint32_t add(std::uint32_t sum, std::uint32_t x, std::uint32_t y, std::uint32_t z) {
         return sum + (x ^ (y ^ z));
     }
 };
 
 struct I {
-    static std::uint32_t mix(std::uint32_t sum, std::uint32_t x, std::uint32_t y, std::uint32_t z) {
+    static std::uint32_t add(std::uint32_t sum, std::uint32_t x, std::uint32_t y, std::uint32_t z) {
         return sum + (y ^ (x | ~z));
     }
 };
@@ -65,7 +65,7 @@ struct I {
 template <class TFunction, unsigned int bits>
 inline void step(std::uint32_t& a, std::uint32_t b, std::uint32_t c, std::uint32_t d,
                  std::uint32_t word, std::uint32_t constant) {
-    a = b + rotate(TFunction::mix(a + word + constant, b, c, d), bits);
+    a = b + rotate(TFunction::add(keepTogether(a + word + constant), b, c, d), bits);
 }
 
 // Four steps of a round: words k, k + stride, ... (mod 16), with the round's four rotations.
@@ -89,21 +89,26 @@ constexpr std::uint32_t sines[64] = {
     0xf4292244, 0x432aff97, 0xab9423a7, 0xfc93a039, 0x655b59c3, 0x8f0ccc92, 0xffeff47d, 0x85845dd1,
     0x6fa87e4f, 0xfe2ce6e0, 0xa3014314, 0x4e0811a1, 0xf7537e82, 0xbd3af235, 0x2ad7d2bb, 0xeb86d391};
 
-void MD5Transform(std::uint32_t (&state)[4], unsigned char const* block) {
-    std::uint32_t x[16];
-    for (unsigned int i = 0; i < 16; ++i)
-        x[i] = loadWord(block + 4 * i);
-    std::uint32_t v[4] = {state[0], state[1], state[2], state[3]};
-    for (unsigned int i = 0; i < 4; ++i)
-        fourSteps<F, 7, 12, 17, 22>(v, x, 4 * i, 1, sines + 4 * i);
-    for (unsigned int i = 0; i < 4; ++i)
-        fourSteps<G, 5, 9, 14, 20>(v, x, 1 + 20 * i, 5, sines + 16 + 4 * i);
-    for (unsigned int i = 0; i < 4; ++i)
-        fourSteps<H, 4, 11, 16, 23>(v, x, 5 + 12 * i, 3, sines + 32 + 4 * i);
-    for (unsigned int i = 0; i < 4; ++i)
-        fourSteps<I, 6, 10, 15, 21>(v, x, 28 * i, 7, sines + 48 + 4 * i);
-    for (unsigned int i = 0; i < 4; ++i)
-        state[i] += v[i];
+// All blocks at once: between two of them the state stays out of memory.
+void MD5Transform(std::uint32_t (&state)[4], unsigned char const* block, unsigned long blocks) {
+    std::uint32_t sum[4] = {state[0], state[1], state[2], state[3]};
+    for (; blocks != 0; --blocks, block += blockBytes) {
+        std::uint32_t x[16];
+        for (unsigned int i = 0; i < 16; ++i)
+            x[i] = boost::endian::load_little_u32(block + 4 * i);
+        std::uint32_t v[4] = {sum[0], sum[1], sum[2], sum[3]};
+        for (unsigned int i = 0; i < 4; ++i)
+            fourSteps<F, 7, 12, 17, 22>(v, x, 4 * i, 1, sines + 4 * i);
+        for (unsigned int i = 0; i < 4; ++i)
+            fourSteps<G, 5, 9, 14, 20>(v, x, 1 + 20 * i, 5, sines + 16 + 4 * i);
+        for (unsigned int i = 0; i < 4; ++i)
+            fourSteps<H, 4, 11, 16, 23>(v, x, 5 + 12 * i, 3, sines + 32 + 4 * i);
+        for (unsigned int i = 0; i < 4; ++i)
+            fourSteps<I, 6, 10, 15, 21>(v, x, 28 * i, 7, sines + 48 + 4 * i);
+        for (unsigned int i = 0; i < 4; ++i)
+            sum[i] += v[i];
+    }
+    std::copy(std::begin(sum), std::end(sum), state);
 }
 
 void MD5Init(MD5_CTX& context) {
@@ -121,25 +126,25 @@ void MD5Update(MD5_CTX& context, unsigned char const* data, unsigned long length
         std::memcpy(context.buffer + held, data, wanted);
         if (held + wanted < blockBytes)
             return;
-        MD5Transform(context.state, context.buffer);
+        MD5Transform(context.state, context.buffer, 1);
         data += wanted;
         length -= wanted;
     }
-    for (; length >= blockBytes; data += blockBytes, length -= blockBytes)
-        MD5Transform(context.state, data);
-    if (length != 0)
-        std::memcpy(context.buffer, data, length);
+    unsigned long const rest = length % blockBytes;
+    MD5Transform(context.state, data, length / blockBytes);
+    if (rest != 0)
+        std::memcpy(context.buffer, data + (length - rest), rest);
 }
 
 void MD5Final(TMd5Digest& digest, MD5_CTX& context) {
     static constexpr unsigned char padding[blockBytes] = {0x80};
     unsigned char bits[8];
-    storeWord(bits, context.count);
+    boost::endian::store_little_u64(bits, context.count);
     std::size_t const held = static_cast<std::size_t>(context.count / 8 % blockBytes);
     MD5Update(context, padding, (held < 56 ? 56 : 120) - held);
     MD5Update(context, bits, sizeof(bits));
     for (std::size_t i = 0; i < 4; ++i)
-        storeWord(digest.data() + 4 * i, context.state[i]);
+        boost::endian::store_little_u32(digest.data() + 4 * i, context.state[i]);
 }
 
 MD5_CTX& contextOf(boost::array<unsigned char, 88>& room) {
