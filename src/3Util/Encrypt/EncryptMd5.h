@@ -50,7 +50,8 @@ class CMd5Creator {
     alignas(8) boost::array<unsigned char, 88> context_;
 };
 
-/// The digest of a TByteVector or a std::string, its terminator left out.
+/// The digest of a TByteVector or a std::string, its terminator left out. A literal must be made a
+/// std::string: by itself it is digested with its terminating zero.
 template <class T>
 TMd5Digest md5(T const& data) {
     TMd5Digest digest;

@@ -18,8 +18,8 @@ namespace Encrypt {
 /// declared constant; an object must not be shared between threads while it works.
 class CRC4 {
   public:
-    /// Sets up the key schedule. The key must not be empty; of a longer one than 256 bytes only
-    /// those count.
+    /// Sets up the key schedule. The key must not be empty, which is not tested; what follows its
+    /// first 256 bytes doesn't count.
     CRC4(unsigned char const* key, unsigned long length);
     explicit CRC4(TByteVector const& key);
     explicit CRC4(std::string const& key);
