@@ -65,7 +65,8 @@ TEST(EncryptRC4Test, GivesTheBestKnownSamples) {
 
 TEST(EncryptRC4Test, TakesKeysOfEveryLength) {
     EncryptTest::CRandomBytes random;
-    for (std::size_t const length : {1, 2, 3, 5, 16, 255, 256, 257, 300}) {
+    std::size_t const lengths[] = {1, 2, 3, 5, 16, 255, 256, 257, 300};
+    for (std::size_t const length : lengths) {
         TByteVector const key = random.bytes(length);
         EXPECT_EQ(streamOf(key, 1000), slowStreamOf(key, 1000)) << length;
     }
