@@ -1,7 +1,14 @@
-// Raises an exception through two guarded blocks, renders it, wraps it and logs it.
+// Raises an exception through two guarded blocks, logs it, shows its text and counts its trace.
+//
+// Prints:
+//     FileSys [SevError] setting language was not found
+//     FileSpec: setting language was not found
+//     passed 2 guarded blocks
+//     wrapped: "setting language was not found"
 
 #include "1Base/Error/Error.h"
 #include "2System/FileSys/FileSysExc.h"
+#include "2System/SysInfo/SysInfoExc.h"
 
 #include <iostream>
 #include <string>
@@ -46,12 +53,12 @@ int main() {
         for (Error::CStackInfo const& block : exc.getStackInfo())
             blocks += block.getLineBegin() < block.getLineEnd() ? 1U : 0U;
         std::cout << "passed " << blocks << " guarded blocks\n";
+
+        // Another chain, for callers who know nothing of files: the text stays, the trace begins
+        // anew.
+        Error::XExc<SysInfo::TExcPreferenceFolder> const wrapper(ERROR_ORIGIN, exc);
+        std::cout << "wrapped: " << wrapper.getInfo().getMessage() << "\n";
     }
 
     Error::CLogSingleton::removeTarget<Error::TTgtLogger, Error::TSevError>(&target);
 }
-
-// Output:
-// FileSys [SevError] setting language was not found
-// FileSpec: setting language was not found
-// passed 2 guarded blocks

@@ -34,7 +34,8 @@ debian() {
   isolate_commands
   export WORK=$work
   printf '%s\n' g++ cmake ninja-build ccache libboost1.81-dev libicu-dev \
-    openjdk-17-jdk-headless libgtest-dev clang-format git python3 shellcheck >"$work/installed"
+    openjdk-17-jdk-headless libgtest-dev libssl-dev clang-format git python3 shellcheck \
+    >"$work/installed"
   : >"$work/calls"
   user 0
   stub dpkg-query <<<'sed "s/$/ installed/" "$WORK/installed"'
