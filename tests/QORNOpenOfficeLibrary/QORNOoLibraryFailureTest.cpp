@@ -15,9 +15,9 @@ using BridgeTest::TFolders;
 using BridgeTest::TTexts;
 
 TFolders const folders = {u"/home/ada", u"/home/ada/Desktop", u"/home/ada/Documents",
-                          u"/tmp/of/ada", u"/srv/work/of/ada"};
+                          u"/tmp/of/ada", u"/srv/office/of/ada"};
 TTexts const texts = {L"/home/ada", L"/home/ada/Desktop", L"/home/ada/Documents", L"/tmp/of/ada",
-                      L"/srv/work/of/ada"};
+                      L"/srv/office/of/ada"};
 
 class CQORNOoLibraryFailureTest : public BridgeTest::CBridgeTest {
   protected:

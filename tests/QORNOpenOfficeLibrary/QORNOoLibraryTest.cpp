@@ -13,9 +13,9 @@ using BridgeTest::TFolders;
 using BridgeTest::TTexts;
 
 TFolders const folders = {u"/home/ada", u"/home/ada/Desktop", u"/home/ada/Documents", u"/tmp",
-                          u"/srv/work"};
+                          u"/srv/office"};
 TTexts const texts = {L"/home/ada", L"/home/ada/Desktop", L"/home/ada/Documents", L"/tmp",
-                      L"/srv/work"};
+                      L"/srv/office"};
 
 class CQORNOoLibraryTest : public BridgeTest::CBridgeTest {
   protected:
