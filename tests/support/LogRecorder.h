@@ -10,6 +10,7 @@
 #include "1Base/Error/ErrorLogging.h"
 
 #include "support/MessageParameters.h"
+#include "support/Place.h"
 
 #include <string>
 #include <vector>
@@ -18,11 +19,7 @@ namespace TestSupport {
 
 /// One record, with the message as it came and as it reads once expanded.
 struct CLogRecord {
-    std::string file;
-    unsigned int line;
-    std::string func;
-    std::string date;
-    std::string time;
+    TPlace place;
     std::string tag;
     std::string target;
     std::string severity;
@@ -41,8 +38,8 @@ class CLogRecorder : public Error::CLogTarget {
                Error::CMessage const& message) const override {
         Strings::string const text = message.getString(false);
         TParameters const parameters = parametersOf(message);
-        records_.push_back({file, line, func, date, time, tag, target, severity, text, parameters,
-                            message.getString(true)});
+        records_.push_back({TPlace(file, line, func, date, time), tag, target, severity, text,
+                            parameters, message.getString(true)});
     }
 
   private:

@@ -37,7 +37,9 @@ using Error::Detail::CAsserter_;
 using TestSupport::CLogRecord;
 using TestSupport::CLogRecorder;
 using TestSupport::parametersOf;
+using TestSupport::placeOf;
 using TestSupport::TParameters;
+using TestSupport::TPlace;
 
 using TParameterList = Strings::CParameterList<wchar_t>;
 
@@ -46,6 +48,10 @@ template <bool doThrow, bool doReport, class TValue, class TParams>
 TValue assertAt(TValue value, char const* expr, TParams const& params) {
     return CAsserter_<doThrow, doReport>::do_assert("/build/A", 7, "int f(int)", "Apr 29 2021",
                                                     "08:35:23", value, expr, params);
+}
+
+TPlace fixedPlace() {
+    return TPlace("/build/A", 7, "int f(int)", "Apr 29 2021", "08:35:23");
 }
 
 // The message's own parameters at that place, in its order.
@@ -75,11 +81,7 @@ class CErrorAssertTest : public TestSupport::CErrorTest {
     void expectReport(Strings::string const& expr, TParameters parameters) {
         ASSERT_EQ(recorder_.records().size(), 1U);
         CLogRecord const& record = recorder_.records()[0];
-        EXPECT_EQ(record.file, "/build/A");
-        EXPECT_EQ(record.line, 7U);
-        EXPECT_EQ(record.func, "int f(int)");
-        EXPECT_EQ(record.date, "Apr 29 2021");
-        EXPECT_EQ(record.time, "08:35:23");
+        EXPECT_EQ(record.place, fixedPlace());
         EXPECT_EQ(record.tag, "ErrorAssert");
         EXPECT_EQ(record.target, "TgtLogger");
         EXPECT_EQ(record.severity, "SevFatal");
@@ -152,12 +154,7 @@ void expectRaised(TValue value, TParams const& params, TParameters const& more,
     } catch (Error::CException const& exc) {
         EXPECT_STREQ(exc.getExcName(), "ErrorAssert");
         EXPECT_NE(dynamic_cast<Error::TExcErrorAssert const*>(&exc), nullptr);
-        Error::COrigin const& origin = exc.getInfo().getOrigin();
-        EXPECT_STREQ(origin.getFile(), "/build/A");
-        EXPECT_EQ(origin.getLine(), 7U);
-        EXPECT_STREQ(origin.getFunc(), "int f(int)");
-        EXPECT_STREQ(origin.getDate(), "Apr 29 2021");
-        EXPECT_STREQ(origin.getTime(), "08:35:23");
+        EXPECT_EQ(placeOf(exc.getInfo().getOrigin()), fixedPlace());
         EXPECT_EQ(exc.getInfo().getSeverity(), Error::SevError);
         EXPECT_EQ(exc.getStackInfo().begin(), exc.getStackInfo().end());
         TParameters expected = parametersAt(L"x > 0");
@@ -325,14 +322,11 @@ TEST_F(CErrorAssertTest, AnAssertionHasItsPlace) {
         line = __LINE__ + 1;
         ERROR_ASSERT(1 > 2);
     } catch (Error::CException const& exc) {
-        EXPECT_STREQ(exc.getInfo().getOrigin().getFile(), __FILE__);
-        EXPECT_EQ(exc.getInfo().getOrigin().getLine(), line);
-        EXPECT_STREQ(exc.getInfo().getOrigin().getFunc(), func);
-        EXPECT_STREQ(exc.getInfo().getOrigin().getDate(), __DATE__);
-        EXPECT_STREQ(exc.getInfo().getOrigin().getTime(), __TIME__);
+        EXPECT_EQ(placeOf(exc.getInfo().getOrigin()),
+                  TPlace(__FILE__, line, func, __DATE__, __TIME__));
     }
     ASSERT_EQ(recorder_.records().size(), 1U);
-    EXPECT_EQ(recorder_.records()[0].line, line);
+    EXPECT_EQ(recorder_.records()[0].place, TPlace(__FILE__, line, func, __DATE__, __TIME__));
 }
 
 TEST_F(CErrorAssertTest, TheTextIsTheExpressionWithItsMacrosExpanded) {

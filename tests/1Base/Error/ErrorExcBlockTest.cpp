@@ -3,6 +3,7 @@
 #include "1Base/Error/Error.h"
 
 #include "support/MessageParameters.h"
+#include "support/Place.h"
 #include "support/Registry.h"
 #include "support/SampleException.h"
 
@@ -18,8 +19,10 @@
 
 namespace {
 
+using TestSupport::placeOf;
 using TestSupport::TExcSample;
 using TestSupport::TParameters;
+using TestSupport::TPlace;
 using TestSupport::XSample;
 
 using CErrorExcBlockTest = TestSupport::CErrorTest;
@@ -148,11 +151,7 @@ void expectConverted(Error::CException const& exc, char const* func, unsigned in
                      Strings::string const& what, std::type_info const& type) {
     EXPECT_NE(dynamic_cast<Error::XExc<TExcX> const*>(&exc), nullptr);
     Error::CInfo const& info = exc.getInfo();
-    EXPECT_STREQ(info.getOrigin().getFile(), __FILE__);
-    EXPECT_EQ(info.getOrigin().getLine(), line);
-    EXPECT_STREQ(info.getOrigin().getFunc(), func);
-    EXPECT_STREQ(info.getOrigin().getDate(), __DATE__);
-    EXPECT_STREQ(info.getOrigin().getTime(), __TIME__);
+    EXPECT_EQ(placeOf(info.getOrigin()), TPlace(__FILE__, line, func, __DATE__, __TIME__));
     EXPECT_EQ(info.getSeverity(), Error::SevError);
     EXPECT_EQ(TestSupport::parametersOf(info.getMessage()),
               (TParameters{{"CStdLibExceptionWhat", what},
@@ -263,12 +262,8 @@ void expectConvertedAt(XStandard const& standard) {
         passOn([&standard] { throw standard; });
         FAIL();
     } catch (TExcX const& exc) {
-        Error::COrigin const& origin = exc.getInfo().getOrigin();
-        EXPECT_STREQ(origin.getFile(), "/build/B");
-        EXPECT_EQ(origin.getLine(), 9U);
-        EXPECT_STREQ(origin.getFunc(), "int g()");
-        EXPECT_STREQ(origin.getDate(), "Jan  1 2020");
-        EXPECT_STREQ(origin.getTime(), "00:00:01");
+        EXPECT_EQ(placeOf(exc.getInfo().getOrigin()),
+                  TPlace("/build/B", 9, "int g()", "Jan  1 2020", "00:00:01"));
         EXPECT_EQ(exc.getStackInfo().begin(), exc.getStackInfo().end());
     }
 }

@@ -341,31 +341,33 @@ bool isFatalMessage(std::string const& text, std::string const& message) {
 char const* const toOne = "Uncaught exception. Output to observer canceled.";
 char const* const toAll = "Uncaught exception. Output to all remaining observers canceled.";
 
-TEST_F(CErrorExcRegistryTest, AFailingObserverIsToldToTheErrorStreamAndTheOthersAreToldOn) {
-    CWitness const before;
-    CFailingObserver const failing;
-    CWitness const after;
-    CRegisteredObserver const registered1(before);
-    CRegisteredObserver const registered2(failing);
-    CRegisteredObserver const registered3(after);
+// A failing observer between two that are well, and what reaches the error stream.
+class CErrorExcFailingObserverTest : public CErrorExcRegistryTest {
+  protected:
+    CWitness const before_;
+    CWitness const after_;
+    std::stringbuf written_;
 
-    std::stringbuf written;
-    CErrorStream const errorStream(&written);
+  private:
+    CFailingObserver const failing_;
+    CRegisteredObserver const registered1_{before_};
+    CRegisteredObserver const registered2_{failing_};
+    CRegisteredObserver const registered3_{after_};
+    CErrorStream const errorStream_{&written_};
+};
+
+TEST_F(CErrorExcFailingObserverTest, AFailingObserverIsToldToTheErrorStreamAndTheOthersAreToldOn) {
     auto sample = makeSample();
-    EXPECT_PRED2(isFatalMessage, written.str(), toOne);
-    written.str("");
+    EXPECT_PRED2(isFatalMessage, written_.str(), toOne);
+    written_.str("");
     sample.reset();
-    EXPECT_PRED2(isFatalMessage, written.str(), toOne);
-    EXPECT_EQ(before.events.size(), 2U);
-    EXPECT_EQ(after.events.size(), 2U);
+    EXPECT_PRED2(isFatalMessage, written_.str(), toOne);
+    EXPECT_EQ(before_.events.size(), 2U);
+    EXPECT_EQ(after_.events.size(), 2U);
     EXPECT_TRUE(liveExceptions().empty());
 }
 
-TEST_F(CErrorExcRegistryTest, AFailingObserverDoesNotTouchTheExceptionInTheMaking) {
-    CFailingObserver const failing;
-    CRegisteredObserver const registered(failing);
-    std::stringbuf written;
-    CErrorStream const errorStream(&written);
+TEST_F(CErrorExcFailingObserverTest, AFailingObserverDoesNotTouchTheExceptionInTheMaking) {
     EXPECT_THROW(ERROR_THROW(TExcSample, Error::msgDuplicate), TExcSample);
 }
 
@@ -390,32 +392,23 @@ class CBrokenTie : private std::streambuf {
     std::ostream* old_;
 };
 
-TEST_F(CErrorExcRegistryTest, WhereTheErrorStreamFailsTooTheRemainingObserversAreNotTold) {
-    CWitness const before;
-    CFailingObserver const failing;
-    CWitness const after;
-    CRegisteredObserver const registered1(before);
-    CRegisteredObserver const registered2(failing);
-    CRegisteredObserver const registered3(after);
-
-    std::stringbuf written;
-    CErrorStream const errorStream(&written);
+TEST_F(CErrorExcFailingObserverTest, WhereTheErrorStreamFailsTooTheRemainingObserversAreNotTold) {
     std::unique_ptr<XSample> sample;
     {
         CBrokenTie const tie;
         sample = makeSample();
     }
-    EXPECT_PRED2(isFatalMessage, written.str(), toAll);
-    EXPECT_EQ(before.events.size(), 1U);
-    EXPECT_TRUE(after.events.empty());
-    written.str("");
+    EXPECT_PRED2(isFatalMessage, written_.str(), toAll);
+    EXPECT_EQ(before_.events.size(), 1U);
+    EXPECT_TRUE(after_.events.empty());
+    written_.str("");
     {
         CBrokenTie const tie;
         sample.reset();
     }
-    EXPECT_PRED2(isFatalMessage, written.str(), toAll);
-    EXPECT_EQ(before.events.size(), 2U);
-    EXPECT_TRUE(after.events.empty());
+    EXPECT_PRED2(isFatalMessage, written_.str(), toAll);
+    EXPECT_EQ(before_.events.size(), 2U);
+    EXPECT_TRUE(after_.events.empty());
 }
 
 // Takes nothing.

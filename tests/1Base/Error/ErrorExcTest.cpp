@@ -3,6 +3,7 @@
 #include "1Base/Error/Error.h"
 
 #include "support/MessageParameters.h"
+#include "support/Place.h"
 #include "support/Registry.h"
 #include "support/SampleException.h"
 
@@ -19,6 +20,7 @@ namespace {
 using TestSupport::messageOf;
 using TestSupport::parameterList;
 using TestSupport::parametersOf;
+using TestSupport::placeOf;
 using TestSupport::sample;
 using TestSupport::TExcSample;
 using TestSupport::TParameters;
@@ -147,12 +149,8 @@ TEST_F(CErrorExcTest, AThrowSiteGivesItsPlaceAndItsBuild) {
         line = __LINE__ + 1;
         ERROR_THROW(TExcSample, Error::msgDuplicate);
     } catch (Error::CException const& exc) {
-        Error::COrigin const& origin = exc.getInfo().getOrigin();
-        EXPECT_STREQ(origin.getFile(), __FILE__);
-        EXPECT_EQ(origin.getLine(), line);
-        EXPECT_STREQ(origin.getFunc(), func);
-        EXPECT_STREQ(origin.getDate(), __DATE__);
-        EXPECT_STREQ(origin.getTime(), __TIME__);
+        EXPECT_EQ(placeOf(exc.getInfo().getOrigin()),
+                  TestSupport::TPlace(__FILE__, line, func, __DATE__, __TIME__));
         EXPECT_EQ(exc.getInfo().getMessage().getString(true), L"Duplicate object exists");
     }
     EXPECT_NE(line, 0U);

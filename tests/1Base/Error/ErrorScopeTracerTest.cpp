@@ -52,15 +52,12 @@ TEST_F(CErrorScopeTracerTest, LogsOnEnteringAndOnLeaving) {
               (TTexts{L"Entering scope 'outer'...", L"Entering scope 'inner'...",
                       L"Leaving scope 'inner'...", L"Leaving scope 'outer'..."}));
     for (TestSupport::CLogRecord const& record : recorder.records()) {
-        EXPECT_EQ(record.file, "/build/A");
-        EXPECT_EQ(record.func, "f()");
-        EXPECT_EQ(record.date, "Apr 29 2021");
-        EXPECT_EQ(record.time, "08:35:23");
         EXPECT_EQ(record.tag, "Error");
         EXPECT_EQ(record.severity, "SevLog");
     }
-    EXPECT_EQ(recorder.records()[0].line, 7U);
-    EXPECT_EQ(recorder.records()[3].line, 7U);
+    TestSupport::TPlace const outer("/build/A", 7, "f()", "Apr 29 2021", "08:35:23");
+    EXPECT_EQ(recorder.records()[0].place, outer);
+    EXPECT_EQ(recorder.records()[3].place, outer);
 }
 
 TEST_F(CErrorScopeTracerTest, LogsOnLeavingByAnException) {
