@@ -13,8 +13,8 @@
 namespace Error {
 
 /// Writes each record as one line of UTF-8 to a stream: `[severity] tag: text (file #line)`, line
-/// breaks within the text as blanks. The stream must outlive the target; a failed stream is left
-/// as it is, and nothing is raised for it.
+/// breaks within the text as blanks, and U+FFFD for what is no character. The stream must outlive
+/// the target; a failed stream is left as it is, and nothing is raised for it.
 class CStreamLogTarget : public CLogTarget {
   public:
     /// Records below `least` are passed over.

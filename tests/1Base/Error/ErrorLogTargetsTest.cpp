@@ -77,6 +77,28 @@ TEST_F(CStreamLogTargetTest, TextsAreUTF8) {
     EXPECT_EQ(stream.str(), lineOf("caf\xC3\xA9 \xF0\x9F\x98\x80"));
 }
 
+TEST_F(CStreamLogTargetTest, ATextThatIsNoUnicodeIsWrittenAllTheSame) {
+    std::ostringstream stream;
+    CStreamLogTarget const target(stream);
+    Strings::CParameterList<wchar_t> params;
+    params.add("a", Strings::string{static_cast<wchar_t>(0xD800), L'|'});
+    params.add("b", Strings::string{static_cast<wchar_t>(0xDFFF), static_cast<wchar_t>(0x110000)});
+    params.add("c", Strings::string{static_cast<wchar_t>(0xD7FF), static_cast<wchar_t>(0x10FFFF)});
+    write(target, "SevWarn", "@(a)@(b)@(c)", params);
+    EXPECT_EQ(stream.str(), lineOf("\xEF\xBF\xBD|\xEF\xBF\xBD\xEF\xBF\xBD"
+                                   "\xED\x9F\xBF\xF4\x8F\xBF\xBF"));
+}
+
+TEST_F(CStreamLogTargetTest, AByteOrderMarkAndAnEmptyTextAreTexts) {
+    std::ostringstream stream;
+    CStreamLogTarget const target(stream);
+    Strings::CParameterList<wchar_t> params;
+    params.add("mark", L"\uFEFF");
+    write(target, "SevWarn", "@(mark)", params);
+    write(target, "SevWarn", "");
+    EXPECT_EQ(stream.str(), lineOf("\xEF\xBB\xBF") + lineOf(""));
+}
+
 TEST_F(CStreamLogTargetTest, RecordsBelowTheLeastSeverityArePassedOver) {
     char const* const names[] = {"SevDebug", "SevLog",   "SevInfo",
                                  "SevWarn",  "SevError", "SevFatal"};

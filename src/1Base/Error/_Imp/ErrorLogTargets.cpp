@@ -21,12 +21,24 @@ bool isBelow(char const* severity, ESeverity least) {
     return false;
 }
 
+bool isNoCharacter(wchar_t element) {
+    auto const code = static_cast<unsigned int>(element);
+    return code > 0x10FFFF || (code >= 0xD800 && code <= 0xDFFF);
+}
+
+// The expanded text on one line, behind a blank. A target must not raise, and the conversion would
+// for what is no character, and for a lone byte order mark.
+std::string buildText(CMessage const& message) {
+    Strings::string text = L" " + message.getString(true);
+    std::replace(text.begin(), text.end(), L'\n', L' ');
+    std::replace_if(text.begin(), text.end(), isNoCharacter, L'\uFFFD');
+    return Encoding::convert<std::string>(text);
+}
+
 std::string buildLine(char const* file, unsigned int line, char const* tag, char const* severity,
                       CMessage const& message) {
-    std::string text = message.getString<std::string>(true);
-    std::replace(text.begin(), text.end(), '\n', ' ');
-    return std::string("[") + severity + "] " + tag + ": " + text + " (" + file + " #" +
-           std::to_string(line) + ")\n";
+    return std::string("[") + severity + "] " + tag + ":" + buildText(message) + " (" + file +
+           " #" + std::to_string(line) + ")\n";
 }
 
 } // namespace
