@@ -344,12 +344,12 @@ char const* const toAll = "Uncaught exception. Output to all remaining observers
 // A failing observer between two that are well, and what reaches the error stream.
 class CErrorExcFailingObserverTest : public CErrorExcRegistryTest {
   protected:
-    CWitness const before_;
-    CWitness const after_;
+    CWitness const before_{};
+    CWitness const after_{};
     std::stringbuf written_;
 
   private:
-    CFailingObserver const failing_;
+    CFailingObserver const failing_{};
     CRegisteredObserver const registered1_{before_};
     CRegisteredObserver const registered2_{failing_};
     CRegisteredObserver const registered3_{after_};
