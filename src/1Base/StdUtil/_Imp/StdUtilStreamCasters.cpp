@@ -13,7 +13,8 @@ Strings::string CStreamCaster<Strings::string, char const*>::cast(char const* so
 }
 
 Strings::string CStreamCaster<Strings::string, wchar_t const*>::cast(wchar_t const* source) {
-    return Encoding::convert<Strings::string>(Strings::string(source));
+    // Converting the kind into itself would copy the text once more.
+    return Strings::string(source);
 }
 
 template class CStreamCaster<Strings::string, bool>;
