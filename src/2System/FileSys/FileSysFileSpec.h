@@ -11,14 +11,18 @@
 #include "1Base/Strings/StringsKinds.h"
 
 #include <iosfwd>
+#include <list>
 #include <string>
 
 namespace FileSys {
 
+class CFileInfo;
+
 /// One path text, kept unit for unit as the caller gave it. Nothing is resolved, normalised or
-/// looked up on a disk: every operation is a search in the text for the separators. The empty text
-/// is the empty specification, and any other text is a valid value. Nothing here fails, but for
-/// memory and for a narrow text that is not UTF-8.
+/// looked up on a disk but where a member says so: every other operation is a search in the text
+/// for the separators. The empty text is the empty specification, and any other text is a valid
+/// value. But for the members that say so nothing fails, save for memory and for a narrow text that
+/// is not UTF-8.
 class CFileSpec {
   public:
     CFileSpec() = default;
@@ -87,6 +91,50 @@ class CFileSpec {
     /// none.
     CFileSpec& operator+=(Strings::string const& name);
 
+    /// `relative` made absolute against `absolute`, by its text alone: each ".." that it begins
+    /// with climbs one component ("..x" does too), one leading "./" goes, anything further inside
+    /// stays. An absolute `relative` comes back unchanged. The root loses its separator: "/" with
+    /// "x" is "x". Raises the chain of file information below TExcFileInfo and TExcFileSpec where
+    /// it climbs above the start.
+    ///     convertRelativeToAbsolutePath(L"/a/b", L"../c");   // "/a/c"
+    static CFileSpec convertRelativeToAbsolutePath(CFileSpec const& absolute,
+                                                   CFileSpec const& relative);
+
+    /// The folder that both texts have in common, with its trailing separator; this path itself
+    /// where both are equal. A separator here counts as common also where the other text has
+    /// another character: "/a/b" against "/a_c" gives "/a/".
+    CFileSpec getBasePath(CFileSpec const& other) const;
+
+    /// This text without the prefix `base` and one separator behind it; unchanged where `base` is
+    /// no prefix. It knows no components: "/a/bc" against "/a/b" gives "c".
+    CFileSpec getRelativePath(CFileSpec const& base) const;
+
+    /// A legal file name of at most 255 characters: forbidden characters become "_", blanks and
+    /// dots at the end go, an overlong stem is cut before its last character so that the extension
+    /// survives.
+    static Strings::string makeFileName(Strings::string const& text);
+
+    /// The process's working directory; empty where it can't be had or takes more than 1023 bytes.
+    static CFileSpec getCurrentWorkingDir();
+
+    /// Neither raises; what can't be looked up is not there.
+    bool exists() const;
+    bool isFolder() const;
+
+    /// Bytes; 0 for a folder and on failure.
+    unsigned long long getFileSize() const;
+
+    /// Raises the chain of file information where the path does not exist.
+    CFileInfo getFileInfo() const;
+
+    /// Whether the path lies in one of the temporary folders, by isSubFolderOf().
+    bool isTemporary() const;
+
+    /// Draws the file's icon: three bytes a pixel in `rgb`, one in `alpha`, row by row. A width of
+    /// 0 is set to 512, and the height to the width. False, with both texts empty, where there is
+    /// no icon or nothing to draw it with.
+    bool getIcon(std::string& rgb, std::string& alpha, int& width, int& height) const;
+
     static wchar_t getPathSeparator() { return L'/'; }
     static wchar_t getExtensionSeparator() { return L'.'; }
 
@@ -104,6 +152,13 @@ bool operator==(CFileSpec const& left, CFileSpec const& right);
 bool operator<(CFileSpec const& left, CFileSpec const& right);
 
 CFileSpec operator+(CFileSpec left, Strings::string const& right);
+
+/// A path from the file specification of a PDF (ISO 32000, 7.11.2): backslash escapes resolved, and
+/// without its leading separator. The two numbers change nothing here.
+CFileSpec createFileSpecFromAcrobatFileSpec(std::string const& text, int a, int b);
+
+/// Removes all but the first of equal entries, and with `removeMissing` those that do not exist.
+void cleanFileSpecList(std::list<CFileSpec>& specs, bool removeMissing);
 
 std::basic_ostream<wchar_t>& operator<<(std::basic_ostream<wchar_t>& stream, CFileSpec const& spec);
 

@@ -1,0 +1,78 @@
+/// Walking a folder or a tree in a fixed order.
+///
+///     using Iterator = FileSys::CDirIterator;
+///     for (Iterator i(folder, L"pdf", Iterator::eRecursive, Iterator::eFiles); i != Iterator();
+///     ++i)
+///         read(*i);
+#ifndef QORN_2SYSTEM_FILESYSDIRITERATOR_H
+#define QORN_2SYSTEM_FILESYSDIRITERATOR_H
+
+#include "1Base/Strings/StringsKinds.h"
+#include "2System/FileSys/FileSysFileSpec.h"
+
+#include <cstddef>
+#include <iterator>
+#include <memory>
+
+namespace FileSys {
+
+/// An input iterator over regular files and folders; links are followed, and a link that leads
+/// nowhere, a device or a socket is passed over. There is no guard against a cycle of links.
+///
+/// When a folder is opened its files go, sorted, in front of all that is waiting, and its sub
+/// folders, sorted, behind it. The walk asks the disk once an entry and reads one folder at a time;
+/// what was found is delivered even if it has gone since. A folder that can't be listed ends where
+/// its listing failed, and nothing is reported. A name that is not UTF-8 raises TExcEncoding when
+/// it is delivered.
+///
+/// Copies walk on by themselves. An iterator belongs to one thread.
+class CDirIterator {
+  public:
+    using iterator_category = std::input_iterator_tag;
+    using value_type = CFileSpec;
+    using difference_type = std::ptrdiff_t;
+    using pointer = CFileSpec const*;
+    using reference = CFileSpec const&;
+
+    enum ERecursive { eNotRecursive = 0, eRecursive = 1 };
+
+    /// What is delivered.
+    enum EFlags : unsigned int { eFiles = 1, eFolders = 2 };
+
+    /// The end.
+    CDirIterator();
+
+    /// Stands on the first entry, or at the end: there is no error for a missing root. The
+    /// extension has no dot and its case matters; empty, it lets all pass. It filters what is
+    /// delivered, not where the walk descends.
+    CDirIterator(CFileSpec const& root, ERecursive recursive, unsigned int flags);
+    CDirIterator(CFileSpec const& root, unsigned int flags, ERecursive recursive);
+    CDirIterator(CFileSpec const& root, Strings::string const& extension, ERecursive recursive,
+                 unsigned int flags);
+    CDirIterator(CFileSpec const& root, Strings::string const& extension, unsigned int flags,
+                 ERecursive recursive);
+
+    CDirIterator(CDirIterator const& other);
+    CDirIterator& operator=(CDirIterator const& other);
+    ~CDirIterator();
+
+    /// At the end: the empty specification, or "invalid" once the walk has run out.
+    CFileSpec const& operator*() const { return current_; }
+    CFileSpec const* operator->() const { return &current_; }
+
+    CDirIterator& operator++();
+
+    /// Equal where both are at their end, or stand on the same path.
+    friend bool operator==(CDirIterator const& left, CDirIterator const& right);
+    friend bool operator!=(CDirIterator const& left, CDirIterator const& right);
+
+  private:
+    class Impl_;
+
+    std::unique_ptr<Impl_> impl_;
+    CFileSpec current_;
+};
+
+} // namespace FileSys
+
+#endif
