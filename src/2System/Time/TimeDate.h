@@ -117,6 +117,8 @@ class CDate {
     static CDate readDate(std::wistream& stream);
 
   private:
+    void store_(Config::Int32 days, Config::Int32 months, Config::Int32 years);
+
     TDay day_;
     EMonth month_;
     TYear year_;

@@ -1,0 +1,228 @@
+#include "2System/Time/TimeDate.h"
+
+#include "2System/Time/_Imp/TimeMonths.h"
+
+#include <algorithm>
+#include <limits>
+#include <tuple>
+
+namespace Time {
+namespace {
+
+using Config::Int32;
+using Config::wrapAdd;
+using Config::wrapSub;
+using Detail::checkMonth;
+using Detail::firstGregorianYear;
+using Detail::isLeapYear;
+using Detail::maxDaysInMonth;
+
+CDate::EMonth& operator++(CDate::EMonth& month) {
+    if (!checkMonth(month))
+        ERROR_ASSERT_P(ERROR_PARAM(month), !"Invalid month!");
+    return month = month == CDate::emDec ? CDate::emJan : static_cast<CDate::EMonth>(month + 1);
+}
+
+CDate::EMonth& operator--(CDate::EMonth& month) {
+    if (!checkMonth(month))
+        ERROR_ASSERT_P(ERROR_PARAM(month), !"Invalid month!");
+    return month = month == CDate::emJan ? CDate::emDec : static_cast<CDate::EMonth>(month - 1);
+}
+
+// Leap years come back after so many years and days.
+constexpr Int32 yearsInCycle = 400;
+constexpr Int32 daysInCycle = 146097;
+
+Int32 daysInYear(CDate::TYear year) {
+    return isLeapYear(year) ? 366 : 365;
+}
+
+// Days counted from a 1 January of `years`: takes the whole years from them at once that the walk
+// from month to month would take one month after the other.
+void takeYears(Int32& days, CDate::TYear& years) {
+    if (years >= firstGregorianYear && days > daysInCycle) {
+        Int32 const room = (std::numeric_limits<Int32>::max() - years) / yearsInCycle;
+        Int32 const cycles = std::min((days - 1) / daysInCycle, room);
+        days -= cycles * daysInCycle;
+        years += cycles * yearsInCycle;
+    }
+    while (days > daysInYear(years)) {
+        days -= daysInYear(years);
+        years = wrapAdd(years, 1);
+    }
+}
+
+// The same backwards: days that are missing before a 1 January of `years`.
+void giveYears(Int32& days, CDate::TYear& years) {
+    if (years >= firstGregorianYear + yearsInCycle && days <= -daysInCycle) {
+        Int32 const room = (years - firstGregorianYear) / yearsInCycle;
+        Int32 const cycles = std::min(days / -daysInCycle, room);
+        days += cycles * daysInCycle;
+        years -= cycles * yearsInCycle;
+    }
+    for (Int32 before = wrapSub(years, 1); days <= -daysInYear(before);
+         before = wrapSub(years, 1)) {
+        days += daysInYear(before);
+        years = before;
+    }
+}
+
+// The scale of differences: a leap day every four years whatever the century, although the months
+// of the year itself know better.
+Int32 pastDays(CDate::TDay day, CDate::EMonth month, CDate::TYear year) {
+    Int32 const years = wrapSub(year, 1900);
+    Int32 days = wrapAdd(years / 4, Config::wrapMul(years, 365));
+    if (isLeapYear(year))
+        days = wrapSub(days, 1);
+    for (Int32 m = 1; m < month; ++m)
+        days = wrapAdd(days, maxDaysInMonth(m, year));
+    return wrapAdd(days, day);
+}
+
+Int32 pastDays(CDate const& date) {
+    return pastDays(date.getDay(), date.getMonth(), date.getYear());
+}
+
+auto fieldsOf(CDate const& date) {
+    return std::make_tuple(date.getYear(), date.getMonth(), date.getDay());
+}
+
+} // namespace
+
+CDate& CDate::addDays(unsigned int days) {
+    add_(static_cast<Int32>(days), 0, 0);
+    return *this;
+}
+
+CDate& CDate::subDays(unsigned int days) {
+    sub_(static_cast<Int32>(days), 0, 0);
+    return *this;
+}
+
+CDate& CDate::operator+=(int days) {
+    return addDays(static_cast<unsigned int>(days));
+}
+
+CDate& CDate::operator++() {
+    inc_();
+    return *this;
+}
+
+CDate& CDate::operator--() {
+    dec_();
+    return *this;
+}
+
+void CDate::add_(Int32 days, Int32 months, Int32 years) {
+    ERROR_ASSERT((days >= 0) && (months >= 0) && (years >= 0));
+    days = wrapAdd(day_, days);
+    months = wrapAdd(month_, months);
+    years = wrapAdd(year_, years);
+    if (months >= 13) {
+        years = wrapAdd(years, months / kMonthPerYear);
+        months %= kMonthPerYear; // 0 stays as it is
+    }
+    for (Int32 length = maxDaysInMonth(months, years); days > length;
+         length = maxDaysInMonth(months, years)) {
+        days -= length;
+        if (months < kMonthPerYear) {
+            ++months;
+        } else {
+            months = emJan;
+            years = wrapAdd(years, 1);
+            takeYears(days, years);
+        }
+    }
+    store_(days, months, years);
+}
+
+void CDate::sub_(Int32 days, Int32 months, Int32 years) {
+    ERROR_ASSERT((days >= 0) && (months >= 0) && (years >= 0));
+    days = wrapSub(day_, days);
+    months = wrapSub(month_, months);
+    years = wrapSub(year_, years);
+    if (months <= 0) {
+        years = wrapAdd(years, months / kMonthPerYear - 1);
+        months = kMonthPerYear + months % kMonthPerYear;
+    }
+    while (days <= 0) {
+        if (months > emJan) {
+            --months;
+        } else {
+            giveYears(days, years);
+            months = emDec;
+            years = wrapSub(years, 1);
+        }
+        days += maxDaysInMonth(months, years);
+    }
+    days = std::min(days, maxDaysInMonth(months, years));
+    store_(days, months, years);
+}
+
+void CDate::store_(Int32 days, Int32 months, Int32 years) {
+    ERROR_ASSERT_TEXT(months <= kMonthPerYear, "months<= kMonthPerYear");
+    ERROR_ASSERT_TEXT(days <= maxDaysInMonth(months, years),
+                      "days <= maxDaysInMonth(months,years)");
+    day_ = days;
+    month_ = static_cast<EMonth>(months);
+    year_ = years;
+}
+
+void CDate::inc_() {
+    TDay const oldDay = day_;
+    day_ = wrapAdd(oldDay, 1);
+    if (oldDay < maxDaysInMonth(month_, year_))
+        return;
+    day_ = 1;
+    if (month_ == emDec)
+        year_ = wrapAdd(year_, 1);
+    ++month_;
+}
+
+void CDate::dec_() {
+    if (day_ >= 2) {
+        --day_;
+        return;
+    }
+    bool const isJanuary = month_ == emJan;
+    --month_;
+    if (isJanuary)
+        year_ = wrapSub(year_, 1);
+    day_ = maxDaysInMonth(month_, year_);
+}
+
+bool operator==(CDate const& left, CDate const& right) {
+    return fieldsOf(left) == fieldsOf(right);
+}
+
+bool operator!=(CDate const& left, CDate const& right) {
+    return !(left == right);
+}
+
+bool operator<(CDate const& left, CDate const& right) {
+    return fieldsOf(left) < fieldsOf(right);
+}
+
+bool operator>(CDate const& left, CDate const& right) {
+    return right < left;
+}
+
+bool operator<=(CDate const& left, CDate const& right) {
+    return !(left > right);
+}
+
+bool operator>=(CDate const& left, CDate const& right) {
+    return !(left < right);
+}
+
+CDate operator+(CDate const& date, int days) {
+    CDate sum(date);
+    sum += days;
+    return sum;
+}
+
+int operator-(CDate const& left, CDate const& right) {
+    return wrapSub(pastDays(left), pastDays(right));
+}
+
+} // namespace Time
