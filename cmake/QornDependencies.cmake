@@ -5,7 +5,7 @@ include_guard(GLOBAL)
 
 # Archives, so that the product meets no other Boost in the host's process.
 set(Boost_USE_STATIC_LIBS ON)
-find_package(Boost 1.81 REQUIRED COMPONENTS filesystem)
+find_package(Boost 1.81 REQUIRED COMPONENTS filesystem thread)
 if(NOT APPLE)
   find_package(ICU 72 REQUIRED COMPONENTS uc i18n data)
 endif()

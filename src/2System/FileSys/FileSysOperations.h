@@ -11,8 +11,6 @@
 #include "1Base/Strings/StringsKinds.h"
 #include "2System/FileSys/FileSysFileSpec.h"
 
-#include <ios>
-
 namespace FileSys {
 
 /// Makes the folder and its missing parents. One that exists is no failure.
@@ -38,9 +36,9 @@ void copyFileToFolder(CFileSpec const& from, CFileSpec const& folder, bool overw
 void moveFile(CFileSpec const& from, CFileSpec const& to, bool overwrite);
 void moveFileToFolder(CFileSpec const& from, CFileSpec const& folder, bool overwrite);
 
-/// Whether the file opens with this mode. A file that came to be by the attempt is removed again;
-/// one that was there is truncated where the mode says so.
-bool canOpen(CFileSpec const& spec, std::ios_base::openmode mode);
+/// Whether the file opens with this std::ios_base::openmode. A file that came to be by the attempt
+/// is removed again; one that was there is truncated where the mode says so.
+bool canOpen(CFileSpec const& spec, unsigned int mode);
 
 bool canRead(CFileSpec const& spec);
 
