@@ -3,6 +3,7 @@
 #include "2System/Time/_Imp/TimeMonths.h"
 
 #include <algorithm>
+#include <cstdint>
 #include <limits>
 #include <tuple>
 
@@ -17,6 +18,9 @@ using Detail::firstGregorianYear;
 using Detail::isLeapYear;
 using Detail::maxDaysInMonth;
 
+constexpr CDate::TYear firstYear = std::numeric_limits<CDate::TYear>::min();
+constexpr CDate::TYear lastYear = std::numeric_limits<CDate::TYear>::max();
+
 CDate::EMonth& operator++(CDate::EMonth& month) {
     if (!checkMonth(month))
         ERROR_ASSERT_P(ERROR_PARAM(month), !"Invalid month!");
@@ -29,41 +33,53 @@ CDate::EMonth& operator--(CDate::EMonth& month) {
     return month = month == CDate::emJan ? CDate::emDec : static_cast<CDate::EMonth>(month - 1);
 }
 
-// Leap years come back after so many years and days.
-constexpr Int32 yearsInCycle = 400;
-constexpr Int32 daysInCycle = 146097;
+// So many years on, leap years come back.
+struct CCycle {
+    Int32 years;
+    Int32 days;
+};
+
+CCycle cycleOf(CDate::TYear year) {
+    return year < firstGregorianYear ? CCycle{1, 365} : CCycle{400, 146097};
+}
 
 Int32 daysInYear(CDate::TYear year) {
     return isLeapYear(year) ? 366 : 365;
 }
 
-// Days counted from a 1 January of `years`: takes the whole years from them at once that the walk
-// from month to month would take one month after the other.
+// Days counted from a 1 January of `years`: takes the whole years from them that a walk from month
+// to month would take, whole cycles at once, which end where the rule changes or the number wraps.
 void takeYears(Int32& days, CDate::TYear& years) {
-    if (years >= firstGregorianYear && days > daysInCycle) {
-        Int32 const room = (std::numeric_limits<Int32>::max() - years) / yearsInCycle;
-        Int32 const cycles = std::min((days - 1) / daysInCycle, room);
-        days -= cycles * daysInCycle;
-        years += cycles * yearsInCycle;
-    }
     while (days > daysInYear(years)) {
-        days -= daysInYear(years);
-        years = wrapAdd(years, 1);
+        CCycle const cycle = cycleOf(years);
+        std::int64_t const end = years < firstGregorianYear ? firstGregorianYear : lastYear;
+        auto const cycles = static_cast<Int32>(
+            std::min<std::int64_t>((end - years) / cycle.years, (days - 1) / cycle.days));
+        if (cycles > 0) {
+            days -= cycles * cycle.days;
+            years += cycles * cycle.years;
+        } else {
+            days -= daysInYear(years);
+            years = wrapAdd(years, 1);
+        }
     }
 }
 
-// The same backwards: days that are missing before a 1 January of `years`.
+// The same backwards, for days that are missing before a 1 January of `years`.
 void giveYears(Int32& days, CDate::TYear& years) {
-    if (years >= firstGregorianYear + yearsInCycle && days <= -daysInCycle) {
-        Int32 const room = (years - firstGregorianYear) / yearsInCycle;
-        Int32 const cycles = std::min(days / -daysInCycle, room);
-        days += cycles * daysInCycle;
-        years -= cycles * yearsInCycle;
-    }
-    for (Int32 before = wrapSub(years, 1); days <= -daysInYear(before);
+    for (CDate::TYear before = wrapSub(years, 1); days <= -daysInYear(before);
          before = wrapSub(years, 1)) {
-        days += daysInYear(before);
-        years = before;
+        CCycle const cycle = cycleOf(before);
+        std::int64_t const begin = before < firstGregorianYear ? firstYear : firstGregorianYear;
+        auto const cycles = static_cast<Int32>(
+            std::min<std::int64_t>((years - begin) / cycle.years, days / -cycle.days));
+        if (cycles > 0) {
+            days += cycles * cycle.days;
+            years -= cycles * cycle.years;
+        } else {
+            days += daysInYear(before);
+            years = before;
+        }
     }
 }
 
