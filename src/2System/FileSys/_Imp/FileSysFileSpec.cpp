@@ -1,5 +1,7 @@
 #include "2System/FileSys/FileSysFileSpec.h"
 
+#include "1Base/Error/ErrorMacros.h"
+
 #include <ostream>
 #include <utility>
 
@@ -59,26 +61,34 @@ Strings::string CFileSpec::getFullName(bool) const {
 }
 
 Strings::string CFileSpec::getPath() const {
+    ERROR_BLOCK_BEGIN
     std::size_t const position = findLastPathSep(path_);
     if (position == notFound)
         return Strings::string();
     // The root keeps its separator.
     return path_.substr(0, position == 0 ? 1 : position);
+    ERROR_BLOCK_END
 }
 
 Strings::string CFileSpec::getFile() const {
+    ERROR_BLOCK_BEGIN
     std::size_t const position = findLastPathSep(path_);
     return position == notFound ? path_ : path_.substr(position + 1);
+    ERROR_BLOCK_END
 }
 
 Strings::string CFileSpec::getFileName() const {
+    ERROR_BLOCK_BEGIN
     Strings::string const file = getFile();
     return file.substr(0, findLastExtSep(file));
+    ERROR_BLOCK_END
 }
 
 Strings::string CFileSpec::getFileExtension() const {
+    ERROR_BLOCK_BEGIN
     std::size_t const position = findLastExtSep(path_);
     return position == notFound ? Strings::string() : path_.substr(position + 1);
+    ERROR_BLOCK_END
 }
 
 CFileSpec CFileSpec::getParentFolder() const {
@@ -90,11 +100,13 @@ bool CFileSpec::isSubFolderOf(CFileSpec const& other) const {
 }
 
 void CFileSpec::setFileExtension(Strings::string const& extension, bool replace) {
+    ERROR_BLOCK_BEGIN
     std::size_t const position = replace ? findLastExtSep(path_) : notFound;
     if (position != notFound)
         path_.erase(position);
     if (!replace || !extension.empty())
         path_ += getExtensionSeparator() + extension;
+    ERROR_BLOCK_END
 }
 
 CFileSpec& CFileSpec::operator+=(Strings::string const& name) {
