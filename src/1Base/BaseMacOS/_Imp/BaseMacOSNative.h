@@ -18,8 +18,8 @@ bool setHiddenAttribute(std::string const& path, bool hidden);
 bool createBookmarkFile(std::string const& source, std::string const& bookmark);
 bool resolveBookmarkFile(std::string const& bookmark, std::string& result);
 
-/// `folder` and `domain` are those of MacOS::getSpecialFolder(), any value allowed. False where the
-/// system knows no such folder.
+/// A known value of TSystemFolderType and one of TSystemFolderDomain give the whole path, with what
+/// the type appends to the system's own folder. False where the system knows no such folder.
 bool getSpecialFolder(int folder, int domain, std::string& path);
 
 } // namespace Native
