@@ -8,6 +8,7 @@ set(Boost_USE_STATIC_LIBS ON)
 find_package(Boost 1.81 REQUIRED COMPONENTS filesystem thread)
 if(NOT APPLE)
   find_package(ICU 72 REQUIRED COMPONENTS uc i18n data)
+  find_package(Plist REQUIRED)
 endif()
 
 # JAVA_HOME may be unset although a compiler is on the path; its real place then says where.

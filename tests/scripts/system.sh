@@ -34,7 +34,7 @@ debian() {
   isolate_commands
   export WORK=$work
   printf '%s\n' g++ cmake ninja-build ccache libboost1.81-dev \
-    libboost-filesystem1.81-dev libboost-thread1.81-dev libicu-dev \
+    libboost-filesystem1.81-dev libboost-thread1.81-dev libicu-dev libplist-dev \
     openjdk-17-jdk-headless libgtest-dev libssl-dev clang-format git python3 shellcheck \
     >"$work/installed"
   : >"$work/calls"

@@ -20,7 +20,7 @@ namespace CFPlatform {
 struct Object {
     using TFinalize = void (*)(Object& object);
 
-    explicit Object(TFinalize finalizer) : references(1), finalize(finalizer) {}
+    constexpr explicit Object(TFinalize finalizer) : references(1), finalize(finalizer) {}
 
     std::atomic<CFIndex> references;
     TFinalize finalize;

@@ -8,7 +8,7 @@
 #include <CoreFoundation/CFString.h>
 
 struct __CFString : CFPlatform::Object {
-    __CFString(TFinalize finalizer, UniChar* storage, CFIndex count)
+    constexpr __CFString(TFinalize finalizer, UniChar* storage, CFIndex count)
         : Object(finalizer), units(storage), length(count) {}
 
     UniChar* units;
