@@ -5,6 +5,7 @@
 #include "1Base/StdUtil/StdUtil.h"
 
 #include "support/Benchmark.h"
+#include "support/Inputs.h"
 
 #include <boost/lexical_cast.hpp>
 
@@ -17,12 +18,10 @@
 #endif
 
 #include <charconv>
-#include <cstddef>
 #include <cstdlib>
 #include <cwchar>
 #include <iostream>
 #include <iterator>
-#include <memory>
 #include <random>
 #include <sstream>
 #include <string>
@@ -30,29 +29,7 @@
 
 namespace {
 
-// Inputs at random, one after the other, so that no contender lives on a repeated pattern.
-template <class TInput>
-class CInputs {
-  public:
-    explicit CInputs(std::vector<TInput> inputs)
-        : inputs_(std::make_shared<std::vector<TInput>>(std::move(inputs))) {}
-
-    TInput const& next() const { return (*inputs_)[(*position_)++ % inputs_->size()]; }
-
-    template <class TConvert>
-    auto map(TConvert convert) const {
-        std::vector<decltype(convert(inputs_->front()))> results;
-        for (TInput const& input : *inputs_)
-            results.push_back(convert(input));
-        return CInputs<typename decltype(results)::value_type>(std::move(results));
-    }
-
-    bool operator==(CInputs const& other) const { return *inputs_ == *other.inputs_; }
-
-  private:
-    std::shared_ptr<std::vector<TInput>> inputs_;
-    std::shared_ptr<std::size_t> position_ = std::make_shared<std::size_t>(0);
-};
+using Benchmarks::CInputs;
 
 template <class TNumber>
 CInputs<TNumber> randomNumbers(int digits) {
