@@ -13,6 +13,7 @@
 
 #include <benchmark/benchmark.h>
 
+#include <chrono>
 #include <string>
 #include <utility>
 
@@ -28,6 +29,28 @@ void add(std::string const& operation, std::string const& contender, TRun run) {
                                      for (auto _ : state)
                                          benchmark::DoNotOptimize(run());
                                  });
+}
+
+/// Measures one `run()` at a time by the clock on the wall, between `prepare()` and `finish()`,
+/// which don't count: for work that is done by other processes, or that needs a fresh target each
+/// time.
+template <class TPrepare, class TRun, class TFinish>
+void addByWall(std::string const& operation, std::string const& contender, TPrepare prepare,
+               TRun run, TFinish finish) {
+    auto const measure = [=](benchmark::State& state) {
+        for (auto _ : state) {
+            prepare();
+            auto const start = std::chrono::steady_clock::now();
+            benchmark::DoNotOptimize(run());
+            std::chrono::duration<double> const taken = std::chrono::steady_clock::now() - start;
+            finish();
+            state.SetIterationTime(taken.count());
+        }
+    };
+    benchmark::RegisterBenchmark((operation + "/" + contender).c_str(), measure)
+        ->UseManualTime()
+        ->Iterations(1)
+        ->Unit(benchmark::kMillisecond);
 }
 
 /// Calls a function of the program's own before `main`, where benchmarks have to be added.
