@@ -1,9 +1,10 @@
 #include "2System/FileSys/FileSysDirIterator.h"
 
 #include "1Base/Encoding/EncodingConverter.h"
+#include "2System/FileSys/_Imp/FileSysDirListing.h"
 
-#include <boost/filesystem/directory.hpp>
 #include <boost/filesystem/file_status.hpp>
+#include <boost/filesystem/operations.hpp>
 #include <boost/filesystem/path.hpp>
 
 #include <algorithm>
@@ -42,6 +43,14 @@ class SFileDataComparator {
   private:
     std::size_t common_;
 };
+
+// What the paths of a folder's entries begin with.
+std::string prefixOf(boost::filesystem::path const& folder) {
+    std::string prefix = folder.native();
+    if (prefix.back() != '/')
+        prefix += '/';
+    return prefix;
+}
 
 } // namespace
 
@@ -116,22 +125,31 @@ class CDirIterator::Impl_ {
                         std::make_move_iterator(folders.end()));
     }
 
-    // What was found before a failure counts.
+    // What was found before a failure counts. The listing moves on before an entry is looked at, so
+    // that the entry whose successor can't be read is lost with it.
     void read_(boost::filesystem::path const& folder, TEntries& files, TEntries& folders) const {
-        bool const wantsFolders = recursive_ != eNotRecursive || delivers_(eFolders);
+        std::string const prefix = prefixOf(folder);
         try {
-            for (boost::filesystem::directory_iterator entry(folder), end; entry != end;) {
-                boost::filesystem::directory_entry const found = *entry;
-                ++entry;
-                SFileData_t data = {found.path(), found.status()};
-                if (wantsFolders && data.is_directory())
-                    folders.push_back(std::move(data));
-                else if (delivers_(eFiles) && data.is_file() &&
-                         (extension_.empty() || entry_matches_extension_(data.path)))
-                    files.push_back(std::move(data));
+            CDirListing listing(folder.native());
+            for (bool isThere = listing.next(); isThere;) {
+                boost::filesystem::file_type const type = listing.type();
+                SFileData_t data = {prefix + listing.name(), boost::filesystem::file_status(type)};
+                isThere = listing.next();
+                if (type == boost::filesystem::status_error)
+                    data.status = boost::filesystem::status(data.path);
+                sortIn_(std::move(data), files, folders);
             }
         } catch (std::exception const&) {
         }
+    }
+
+    void sortIn_(SFileData_t&& data, TEntries& files, TEntries& folders) const {
+        bool const wantsFolders = recursive_ != eNotRecursive || delivers_(eFolders);
+        if (wantsFolders && data.is_directory())
+            folders.push_back(std::move(data));
+        else if (delivers_(eFiles) && data.is_file() &&
+                 (extension_.empty() || entry_matches_extension_(data.path)))
+            files.push_back(std::move(data));
     }
 
     bool entry_matches_extension_(boost::filesystem::path const& path) const {
