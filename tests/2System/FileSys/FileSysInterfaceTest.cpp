@@ -3,6 +3,8 @@
 #include "2System/FileSys/FileSys.h"
 
 #include <functional>
+#include <iterator>
+#include <list>
 #include <ostream>
 #include <set>
 #include <string>
@@ -11,6 +13,8 @@
 
 namespace {
 
+using FileSys::CDirIterator;
+using FileSys::CFileInfo;
 using FileSys::CFileSpec;
 using Strings::string;
 
@@ -65,5 +69,67 @@ static_assert(
     exists<static_cast<std::basic_ostream<wchar_t>& (*)(std::basic_ostream<wchar_t>&,
                                                         CFileSpec const&)>(FileSys::operator<<)>);
 static_assert(std::is_same_v<std::set<CFileSpec>::key_compare, std::less<CFileSpec>>);
+
+using TQuestion = bool (CFileSpec::*)() const;
+using TRelation = CFileSpec (CFileSpec::*)(CFileSpec const&) const;
+static_assert(std::is_same_v<decltype(CFileSpec::convertRelativeToAbsolutePath),
+                             CFileSpec(CFileSpec const&, CFileSpec const&)>);
+static_assert(std::is_same_v<decltype(&CFileSpec::getBasePath), TRelation>);
+static_assert(std::is_same_v<decltype(&CFileSpec::getRelativePath), TRelation>);
+static_assert(std::is_same_v<decltype(CFileSpec::makeFileName), string(string const&)>);
+static_assert(std::is_same_v<decltype(CFileSpec::getCurrentWorkingDir), CFileSpec()>);
+static_assert(std::is_same_v<decltype(&CFileSpec::exists), TQuestion>);
+static_assert(std::is_same_v<decltype(&CFileSpec::isFolder), TQuestion>);
+static_assert(std::is_same_v<decltype(&CFileSpec::isTemporary), TQuestion>);
+static_assert(
+    std::is_same_v<decltype(&CFileSpec::getFileSize), unsigned long long (CFileSpec::*)() const>);
+static_assert(std::is_same_v<decltype(&CFileSpec::getFileInfo), CFileInfo (CFileSpec::*)() const>);
+static_assert(std::is_same_v<decltype(&CFileSpec::getIcon),
+                             bool (CFileSpec::*)(std::string&, std::string&, int&, int&) const>);
+static_assert(std::is_same_v<decltype(FileSys::createFileSpecFromAcrobatFileSpec),
+                             CFileSpec(std::string const&, int, int)>);
+static_assert(
+    std::is_same_v<decltype(FileSys::cleanFileSpecList), void(std::list<CFileSpec>&, bool)>);
+
+static_assert(std::is_constructible_v<CFileInfo, string const&>);
+static_assert(std::is_copy_constructible_v<CFileInfo> && std::is_copy_assignable_v<CFileInfo>);
+static_assert(!std::is_default_constructible_v<CFileInfo> && !std::is_polymorphic_v<CFileInfo>);
+static_assert(sizeof(CFileInfo) == sizeof(void*));
+using TFact = bool (CFileInfo::*)() const;
+static_assert(std::is_same_v<decltype(&CFileInfo::exists), TFact>);
+static_assert(std::is_same_v<decltype(&CFileInfo::isFolder), TFact>);
+static_assert(std::is_same_v<decltype(&CFileInfo::isHidden), TFact>);
+static_assert(std::is_same_v<decltype(&CFileInfo::isReadOnly), TFact>);
+static_assert(
+    std::is_same_v<decltype(&CFileInfo::getFileSize), unsigned long long (CFileInfo::*)() const>);
+using TMoment = Time::CDateTime (CFileInfo::*)() const;
+static_assert(std::is_same_v<decltype(&CFileInfo::getCreationDate), TMoment>);
+static_assert(std::is_same_v<decltype(&CFileInfo::getModificationDate), TMoment>);
+
+using TRecursive = CDirIterator::ERecursive;
+static_assert(CDirIterator::eNotRecursive == 0 && CDirIterator::eRecursive == 1);
+static_assert(CDirIterator::eFiles == 1 && CDirIterator::eFolders == 2);
+static_assert(std::is_default_constructible_v<CDirIterator>);
+static_assert(std::is_constructible_v<CDirIterator, CFileSpec const&, TRecursive, unsigned int>);
+static_assert(std::is_constructible_v<CDirIterator, CFileSpec const&, unsigned int, TRecursive>);
+static_assert(std::is_constructible_v<CDirIterator, CFileSpec const&, string const&, TRecursive,
+                                      unsigned int>);
+static_assert(std::is_constructible_v<CDirIterator, CFileSpec const&, string const&, unsigned int,
+                                      TRecursive>);
+static_assert(std::is_copy_constructible_v<CDirIterator> &&
+              std::is_copy_assignable_v<CDirIterator> && !std::is_polymorphic_v<CDirIterator>);
+static_assert(
+    std::is_same_v<std::iterator_traits<CDirIterator>::iterator_category, std::input_iterator_tag>);
+static_assert(
+    std::is_same_v<decltype(&CDirIterator::operator*), CFileSpec const& (CDirIterator::*)() const>);
+static_assert(std::is_same_v<decltype(&CDirIterator::operator->),
+                             CFileSpec const* (CDirIterator::*)() const>);
+static_assert(std::is_same_v<decltype(++std::declval<CDirIterator&>()), CDirIterator&>);
+static_assert(std::is_same_v<decltype(std::declval<CDirIterator const&>() ==
+                                      std::declval<CDirIterator const&>()),
+                             bool>);
+static_assert(std::is_same_v<decltype(std::declval<CDirIterator const&>() !=
+                                      std::declval<CDirIterator const&>()),
+                             bool>);
 
 } // namespace
