@@ -46,15 +46,20 @@ std::string parentOf(std::string const& path) {
     return path.substr(0, path.rfind('/'));
 }
 
-// TMPDIR may be missing, empty, relative or no folder at all.
+bool isWritableFolder(std::string const& path) {
+    struct stat status;
+    return stat(path.c_str(), &status) == 0 && S_ISDIR(status.st_mode) &&
+           access(path.c_str(), W_OK | X_OK) == 0;
+}
+
+// TMPDIR may be missing, empty, relative, closed or no folder at all.
 std::string temporaryBase() {
     char const* const variable = std::getenv("TMPDIR");
     char* const real =
         variable == nullptr || *variable == '\0' ? nullptr : realpath(variable, nullptr);
     std::string const base = real == nullptr ? "/tmp" : real;
     std::free(real);
-    struct stat status;
-    return stat(base.c_str(), &status) == 0 && S_ISDIR(status.st_mode) ? base : "/tmp";
+    return isWritableFolder(base) ? base : "/tmp";
 }
 
 // A new folder that other users may enter; empty where there is none.

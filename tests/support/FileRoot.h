@@ -57,7 +57,7 @@ class CEnvironment {
     std::map<std::string, std::optional<std::string>> before_;
 };
 
-/// An empty folder below TMPDIR, or below "/tmp" where that is no folder, which goes at the end
+/// An empty folder below TMPDIR, or below "/tmp" where that can't be written, which goes at the end
 /// with all in it. While it lives HOME, TMPDIR and the XDG base folders lie in it as well, beside
 /// the empty folder, and all other XDG variables are unset. Fails the running test where it can't
 /// be made.

@@ -99,9 +99,13 @@ TEST(FileRootTest, AnyTemporaryFolderWillDo) {
         CFileRoot const root;
         EXPECT_EQ(root.path().compare(0, 5, "/tmp/"), 0) << root.path();
     }
-    environment.set("TMPDIR", ".");
-    CFileRoot const root;
-    EXPECT_EQ(root.path()[0], '/');
+    ASSERT_EQ(chdir(outer.path().c_str()), 0);
+    environment.set("TMPDIR", "with blanks");
+    {
+        CFileRoot const root;
+        EXPECT_EQ(root.path().compare(0, outer.path().size(), outer.path()), 0) << root.path();
+    }
+    ASSERT_EQ(chdir("/"), 0);
 }
 
 // Ends the process with 3 where the running test has failed.
