@@ -14,6 +14,9 @@
 #include <fstream>
 #include <iterator>
 
+// Not every system declares it.
+extern char** environ;
+
 namespace TestSupport {
 namespace {
 

@@ -23,7 +23,8 @@ namespace FileSys {
 /// folders, sorted, behind it. The walk asks the disk once an entry and reads one folder at a time;
 /// what was found is delivered even if it has gone since. A folder that can't be listed ends where
 /// its listing failed, and nothing is reported. A name that is not UTF-8 raises TExcEncoding when
-/// it is delivered.
+/// it is delivered, and the walk may go on behind it; under a filter an extension that is not UTF-8
+/// raises when its folder is opened.
 ///
 /// Copies walk on by themselves. An iterator belongs to one thread.
 class CDirIterator {

@@ -3,6 +3,7 @@
 #include "2System/FileSys/FileSysDirIterator.h"
 
 #include "support/FileRoot.h"
+#include "support/FolderWalk.h"
 
 #include <gtest/gtest.h>
 
@@ -66,11 +67,8 @@ namespace {
 using FileSys::CDirIterator;
 using FileSys::CFileSpec;
 using TestSupport::makeFolders;
+using TestSupport::TNames;
 using TestSupport::writeFile;
-
-using TNames = std::vector<std::string>;
-
-constexpr unsigned int both = CDirIterator::eFiles | CDirIterator::eFolders;
 
 class FileSysDirIteratorFaultTest : public TestSupport::CFileRootTest {
   protected:
@@ -82,11 +80,9 @@ class FileSysDirIteratorFaultTest : public TestSupport::CFileRootTest {
     }
 
     TNames walk() const {
-        TNames names;
-        CFileSpec const root(path());
-        for (CDirIterator i(root, CDirIterator::eRecursive, both); i != CDirIterator(); ++i)
-            names.push_back(i->getRelativePath(root).getFullName<std::string>(false));
-        return names;
+        return TestSupport::namesBelow(path(),
+                                       CDirIterator(CFileSpec(path()), CDirIterator::eRecursive,
+                                                    TestSupport::filesAndFolders));
     }
 };
 

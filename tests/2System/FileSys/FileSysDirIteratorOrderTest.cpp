@@ -3,6 +3,7 @@
 #include "2System/FileSys/FileSysDirIterator.h"
 
 #include "support/FileRoot.h"
+#include "support/FolderWalk.h"
 
 #include <gtest/gtest.h>
 
@@ -30,11 +31,10 @@ using FileSys::CDirIterator;
 using FileSys::CFileSpec;
 using TestSupport::makeFolders;
 using TestSupport::makeLink;
+using TestSupport::TNames;
 using TestSupport::writeFile;
 
-using TNames = std::vector<std::string>;
-
-constexpr unsigned int both = CDirIterator::eFiles | CDirIterator::eFolders;
+constexpr unsigned int both = TestSupport::filesAndFolders;
 
 // A tree in memory: the entries of each folder by the folder's path, the root's being empty. A link
 // to a folder is a folder with the entries of the other.
@@ -104,10 +104,8 @@ class CModel {
 
 TNames walk(std::string const& root, CDirIterator::ERecursive recursive, unsigned int flags,
             Strings::string const& extension = Strings::string()) {
-    TNames names;
-    for (CDirIterator i(CFileSpec(root), extension, recursive, flags); i != CDirIterator(); ++i)
-        names.push_back(i->getFullName<std::string>(false).substr(root.size() + 1));
-    return names;
+    return TestSupport::namesBelow(root,
+                                   CDirIterator(CFileSpec(root), extension, recursive, flags));
 }
 
 class FileSysDirIteratorOrderTest : public TestSupport::CFileRootTest {

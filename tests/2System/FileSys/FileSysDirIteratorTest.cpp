@@ -2,6 +2,7 @@
 
 #include "1Base/Encoding/EncodingExc.h"
 #include "support/FileRoot.h"
+#include "support/FolderWalk.h"
 
 #include <gtest/gtest.h>
 
@@ -21,25 +22,17 @@ using FileSys::CDirIterator;
 using FileSys::CFileSpec;
 using TestSupport::makeFolders;
 using TestSupport::makeLink;
+using TestSupport::TNames;
 using TestSupport::writeFile;
 
-using TNames = std::vector<std::string>;
-
-constexpr unsigned int both = CDirIterator::eFiles | CDirIterator::eFolders;
+constexpr unsigned int both = TestSupport::filesAndFolders;
 
 class FileSysDirIteratorTest : public TestSupport::CFileRootTest {
   protected:
     CFileSpec spec() const { return CFileSpec(path()); }
 
-    // What the iterator has still to deliver, by its path from the root.
-    TNames rest(CDirIterator iterator) const {
-        TNames names;
-        for (; iterator != CDirIterator(); ++iterator) {
-            std::string const name = iterator->getFullName<std::string>(false);
-            EXPECT_EQ(name.compare(0, path().size() + 1, path() + "/"), 0) << name;
-            names.push_back(name.substr(path().size() + 1));
-        }
-        return names;
+    TNames rest(CDirIterator const& iterator) const {
+        return TestSupport::namesBelow(path(), iterator);
     }
 
     TNames walk(CDirIterator::ERecursive recursive, unsigned int flags,

@@ -232,6 +232,31 @@ TEST_F(FileSysFileSpecRelationsTest, ASeparatorThatMeetsAnotherCharacterCounts) 
     EXPECT_EQ(base(L"/a", L"a"), L"/");
 }
 
+// Both relations told by the length of the common beginning.
+TEST_F(FileSysFileSpecRelationsTest, EveryPairOfShortPathsIsRelatedByItsCommonBeginning) {
+    std::vector<std::wstring> const texts = textsUpTo<std::wstring>(5, L"/ab");
+    for (std::wstring const& path : texts) {
+        for (std::wstring const& other : texts) {
+            std::size_t same = 0;
+            while (same < path.size() && same < other.size() && path[same] == other[same])
+                ++same;
+            bool const bothGoOn = same < path.size() && same < other.size();
+            std::wstring const seen = path.substr(0, same + (bothGoOn ? 1 : 0));
+            std::wstring const folder = seen.substr(0, seen.rfind(L'/') + 1);
+            ASSERT_EQ(base(path, other), path == other ? path : folder)
+                << testing::PrintToString(path) << " with " << testing::PrintToString(other);
+
+            std::wstring expected = path;
+            if (same == other.size()) {
+                bool const hasSeparator = same < path.size() && path[same] == L'/';
+                expected = path.substr(same + (hasSeparator ? 1 : 0));
+            }
+            ASSERT_EQ(relative(path, other), expected)
+                << testing::PrintToString(path) << " with " << testing::PrintToString(other);
+        }
+    }
+}
+
 TEST_F(FileSysFileSpecRelationsTest, ABaseIsStripped) {
     EXPECT_EQ(relative(L"/a/b", L"/a"), L"b");
     EXPECT_EQ(relative(L"/a/b", L"/a/"), L"b");
