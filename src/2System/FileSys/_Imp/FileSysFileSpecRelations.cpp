@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <cstddef>
+#include <string>
 
 namespace FileSys {
 namespace {
@@ -71,16 +72,16 @@ CFileSpec CFileSpec::convertRelativeToAbsolutePath(CFileSpec const& absolute,
     if (beginsWith(rel, L"./"))
         rel.erase(0, 2);
     while (beginsWith(rel, stepUp)) {
-        if (abs.empty())
-            ERROR_THROW(
-                TExcSpecFileInfo, Error::msgOSCallArgs,
-                ERROR_PARAMS(
-                    Error::buildNamedParameter("function", "convertRelativeToAbsolutePath"),
-                    Error::buildNamedParameter("error",
-                                               "relative path is longer as the absolute one"),
-                    Error::buildNamedParameter(
-                        "args", "absolute path: " + absolute.getFullName<std::string>(false) +
-                                    "relative path: " + relative.getFullName<std::string>(false))));
+        if (abs.empty()) {
+            std::string const args = "absolute path: " + absolute.getFullName<std::string>(false) +
+                                     "relative path: " + relative.getFullName<std::string>(false);
+            ERROR_THROW(TExcSpecFileInfo, Error::msgOSCallArgs,
+                        ERROR_PARAMS(
+                            Error::buildNamedParameter("function", "convertRelativeToAbsolutePath"),
+                            Error::buildNamedParameter(
+                                "error", "relative path is longer as the absolute one"),
+                            ERROR_PARAM(args)));
+        }
         abs = CFileSpec(abs).getPath();
         rel.erase(0, stepUpSize);
     }
