@@ -6,6 +6,7 @@
 
 #include <atomic>
 #include <cstddef>
+#include <limits>
 
 extern "C" {
 /// The only two functions that take and give back an object's memory, in a unit of their own:
@@ -20,11 +21,15 @@ namespace CFPlatform {
 struct Object {
     using TFinalize = void (*)(Object& object);
 
-    constexpr explicit Object(TFinalize finalizer) : references(1), finalize(finalizer) {}
+    constexpr explicit Object(TFinalize finalizer, CFIndex owners = 1) noexcept
+        : references(owners), finalize(finalizer) {}
 
     std::atomic<CFIndex> references;
     TFinalize finalize;
 };
+
+/// The owners of a constant: so many that no release is the last one.
+constexpr CFIndex constantOwners = std::numeric_limits<CFIndex>::max() / 2;
 
 } // namespace CFPlatform
 

@@ -12,11 +12,11 @@
 
 namespace CFPlatform {
 
-/// A static object. Its one owner is the platform, which never releases it.
+/// A static object. It outlives each release, also one too many, as the framework's constants do.
 template <std::size_t size>
 struct StringConstant : __CFString {
     constexpr explicit StringConstant(char16_t const (&text)[size])
-        : __CFString(nullptr, storage, static_cast<CFIndex>(size - 1)), storage() {
+        : __CFString(nullptr, storage, static_cast<CFIndex>(size - 1), constantOwners), storage() {
         for (std::size_t i = 0; i < size; ++i)
             storage[i] = static_cast<UniChar>(text[i]);
     }

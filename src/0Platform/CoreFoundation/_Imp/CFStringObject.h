@@ -8,8 +8,8 @@
 #include <CoreFoundation/CFString.h>
 
 struct __CFString : CFPlatform::Object {
-    constexpr __CFString(TFinalize finalizer, UniChar* storage, CFIndex count)
-        : Object(finalizer), units(storage), length(count) {}
+    constexpr __CFString(TFinalize finalizer, UniChar* storage, CFIndex count, CFIndex owners = 1)
+        : Object(finalizer, owners), units(storage), length(count) {}
 
     UniChar* units;
     CFIndex length;
