@@ -15,6 +15,9 @@
 
 #include <CoreFoundation/CFBase.h>
 #include <CoreFoundation/CFBundle.h>
+#include <CoreFoundation/CFCalendar.h>
+#include <CoreFoundation/CFDate.h>
+#include <CoreFoundation/CFDateFormatter.h>
 #include <CoreFoundation/CFLocale.h>
 #include <CoreFoundation/CFString.h>
 #include <CoreFoundation/CFStringEncodingExt.h>

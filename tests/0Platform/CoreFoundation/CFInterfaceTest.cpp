@@ -19,9 +19,17 @@ static_assert(isType<CFStringRef, __CFString const*> && isType<CFMutableStringRe
 static_assert(isType<CFAllocatorRef, __CFAllocator const*>);
 static_assert(isType<ConstStr255Param, unsigned char const*> && isType<Str255, unsigned char[256]>);
 static_assert(isType<CFStringEncoding, UInt32>);
+static_assert(isType<CFTimeInterval, double> && isType<CFAbsoluteTime, double>);
+static_assert(isType<CFDateRef, __CFDate const*> && isType<CFLocaleRef, __CFLocale const*>);
+static_assert(isType<CFCalendarRef, __CFCalendar*> &&
+              isType<CFDateFormatterRef, __CFDateFormatter*>);
+static_assert(isType<CFCalendarIdentifier, CFStringRef>);
+static_assert(isType<std::underlying_type_t<CFDateFormatterStyle>, CFIndex>);
 static_assert(isType<decltype(CFRange::location), CFIndex> &&
               isType<decltype(CFRange::length), CFIndex>);
 static_assert(isType<decltype(kCFAllocatorDefault), CFAllocatorRef const>);
+static_assert(isType<decltype(kCFGregorianCalendar), CFCalendarIdentifier const>);
+static_assert(isType<decltype(kCFAbsoluteTimeIntervalSince1970), CFTimeInterval const>);
 
 static_assert(kCFStringEncodingMacRoman == 0);
 static_assert(kCFStringEncodingWindowsLatin1 == 1280);
@@ -37,6 +45,10 @@ static_assert(kCFStringNormalizationFormC == 2 && kCFStringNormalizationFormKC =
 static_assert(kCFCompareLessThan == -1 && kCFCompareEqualTo == 0 && kCFCompareGreaterThan == 1);
 static_assert((kCFCompareCaseInsensitive | kCFCompareNumerically |
                kCFCompareDiacriticInsensitive) == 193);
+
+static_assert(kCFDateFormatterNoStyle == 0 && kCFDateFormatterShortStyle == 1 &&
+              kCFDateFormatterMediumStyle == 2 && kCFDateFormatterLongStyle == 3 &&
+              kCFDateFormatterFullStyle == 4);
 
 static_assert(isType<decltype(CFRangeMake), CFRange(CFIndex, CFIndex)>);
 static_assert(isType<decltype(CFRetain), CFTypeRef(CFTypeRef)>);
@@ -60,5 +72,17 @@ static_assert(
 static_assert(
     isType<decltype(CFStringNormalize), void(CFMutableStringRef, CFStringNormalizationForm)>);
 static_assert(isType<decltype(CFStringGetSystemEncoding), CFStringEncoding()>);
+static_assert(isType<decltype(CFLocaleCopyCurrent), CFLocaleRef()>);
+static_assert(isType<decltype(CFDateCreate), CFDateRef(CFAllocatorRef, CFAbsoluteTime)>);
+static_assert(isType<decltype(CFDateGetAbsoluteTime), CFAbsoluteTime(CFDateRef)>);
+static_assert(isType<decltype(CFCalendarCreateWithIdentifier),
+                     CFCalendarRef(CFAllocatorRef, CFCalendarIdentifier)>);
+static_assert(isType<decltype(CFCalendarComposeAbsoluteTime),
+                     Boolean(CFCalendarRef, CFAbsoluteTime*, char const*, ...)>);
+static_assert(isType<decltype(CFDateFormatterCreate),
+                     CFDateFormatterRef(CFAllocatorRef, CFLocaleRef, CFDateFormatterStyle,
+                                        CFDateFormatterStyle)>);
+static_assert(isType<decltype(CFDateFormatterCreateStringWithDate),
+                     CFStringRef(CFAllocatorRef, CFDateFormatterRef, CFDateRef)>);
 
 } // namespace

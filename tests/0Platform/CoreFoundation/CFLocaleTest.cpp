@@ -15,7 +15,7 @@ class CFLocaleTest : public TestSupport::CObjectCountTest {
   protected:
     void SetUp() override {
         TestSupport::CObjectCountTest::SetUp();
-        for (char const* const variable : {"LC_ALL", "LC_CTYPE", "LANG"})
+        for (char const* const variable : {"LC_ALL", "LC_CTYPE", "LC_TIME", "LANG"})
             unsetenv(variable);
     }
 
@@ -60,6 +60,14 @@ TEST_F(CFLocaleTest, TheFirstVariableThatIsSetCounts) {
     EXPECT_EQ(upperI(), turkish);
     setenv("LC_ALL", "C", 1);
     EXPECT_EQ(upperI(), others);
+}
+
+TEST_F(CFLocaleTest, TheCategoryOfDatesDoesNotCountInCaseConversion) {
+    setenv("LC_TIME", "tr_TR", 1);
+    EXPECT_EQ(upperI(), others);
+    setenv("LANG", "tr_TR", 1);
+    setenv("LC_TIME", "en_US", 1);
+    EXPECT_EQ(upperI(), turkish);
 }
 
 TEST_F(CFLocaleTest, AnEmptyVariableCountsAsUnset) {

@@ -8,24 +8,37 @@
 
 #include <cstddef>
 
-struct __CFLocale : CFPlatform::Object {
-    using CFPlatform::Object::Object;
+namespace CFPlatform {
 
+/// Language, script and territory as ICU takes them ("tr_TR", "sr_Latn_RS", "lt").
+struct LocaleName {
     // A longer name is no locale that any system or ICU knows.
     static constexpr std::size_t capacity = 64;
 
-    /// Language and territory ("tr_TR", "lt"); empty for the root locale.
-    char identifier[capacity];
+    char text[capacity];
+};
+
+} // namespace CFPlatform
+
+struct __CFLocale : CFPlatform::Object {
+    using CFPlatform::Object::Object;
+
+    /// Of case conversion; empty for the root locale.
+    CFPlatform::LocaleName characters;
+
+    /// Of dates; empty for the root locale, "C" for what is no locale's name.
+    CFPlatform::LocaleName dates;
 };
 
 namespace CFPlatform {
 
-/// The first of LC_ALL, LC_CTYPE and LANG that is set and not empty, codeset and modifier
+/// The first of LC_ALL, `category` and LANG that is set and not empty, codeset and modifier
 /// included; "" without any. Points into the environment: valid until that changes.
-char const* environmentLocale() noexcept;
+char const* environmentLocale(char const* category) noexcept;
 
-/// The locale's name as ICU takes it. A null locale is the root locale.
-char const* identifierOf(CFLocaleRef locale) noexcept;
+/// The locale's names as ICU takes them. A null locale is the root locale.
+char const* characterIdentifierOf(CFLocaleRef locale) noexcept;
+char const* dateIdentifierOf(CFLocaleRef locale) noexcept;
 
 } // namespace CFPlatform
 

@@ -56,7 +56,7 @@ class Language {
 } // namespace
 
 extern "C" void CFStringUppercase(CFMutableStringRef string, CFLocaleRef locale) {
-    char const* const identifier = identifierOf(locale);
+    char const* const identifier = characterIdentifierOf(locale);
     bool const isGreek = Language(identifier).is("el");
     if (isGreek)
         removeTonos(string);
@@ -64,7 +64,7 @@ extern "C" void CFStringUppercase(CFMutableStringRef string, CFLocaleRef locale)
 }
 
 extern "C" void CFStringLowercase(CFMutableStringRef string, CFLocaleRef locale) {
-    char const* const identifier = identifierOf(locale);
+    char const* const identifier = characterIdentifierOf(locale);
     Language const language(identifier);
     resolveSigmas(string->units, string->length);
     if (language.is("tr") || language.is("az"))

@@ -70,7 +70,7 @@ std::string normalizedCodeset(char const* locale) {
 } // namespace
 
 extern "C" CFStringEncoding CFStringGetSystemEncoding(void) {
-    std::string const codeset = normalizedCodeset(CFPlatform::environmentLocale());
+    std::string const codeset = normalizedCodeset(CFPlatform::environmentLocale("LC_CTYPE"));
     for (Codeset const& known : codesets) {
         if (codeset == known.name)
             return known.encoding;
