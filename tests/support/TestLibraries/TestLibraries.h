@@ -11,8 +11,8 @@
 
 namespace TestSupport {
 
-/// The libraries "First" and "Second" need nothing; "Dependent" needs "Dependency" and does not
-/// find it by itself. Each of them has:
+/// The libraries "First" and "Second" need nothing; "Dependent" needs "apart/Dependency" and does
+/// not find it by itself. Each of them has:
 ///
 ///     char const* libraryName()    its name
 ///     int libraryNumber            42
