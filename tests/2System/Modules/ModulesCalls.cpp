@@ -66,6 +66,18 @@ void __real_CFRelease(CFTypeRef object);
 void* __real_dlopen(char const* file, int mode);
 void* __real_dlsym(void* handle, char const* name);
 int __real_dlclose(void* handle);
+}
+
+namespace {
+
+void* recordedDlsym(void* handle, char const* name) {
+    CLoaderCall const call("dlsym", std::string(" ") + name);
+    return call.fails() ? nullptr : __real_dlsym(handle, name);
+}
+
+} // namespace
+
+extern "C" {
 
 CFURLRef __wrap_CFURLCreateWithFileSystemPath(CFAllocatorRef allocator, CFStringRef filePath,
                                               CFURLPathStyle pathStyle, Boolean isDirectory) {
@@ -123,9 +135,11 @@ void* __wrap_dlopen(char const* file, int mode) {
     return handle;
 }
 
-void* __wrap_dlsym(void* handle, char const* name) {
-    CLoaderCall const call("dlsym", std::string(" ") + name);
-    return call.fails() ? nullptr : __real_dlsym(handle, name);
+// A sanitizer's run-time library calls it before its own checks can run.
+__attribute__((no_sanitize("address", "undefined"))) void* __wrap_dlsym(void* handle,
+                                                                        char const* name) {
+    return ModulesTest::recorder == nullptr ? __real_dlsym(handle, name)
+                                            : recordedDlsym(handle, name);
 }
 
 int __wrap_dlclose(void* handle) {
