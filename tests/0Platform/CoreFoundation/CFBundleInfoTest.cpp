@@ -8,8 +8,8 @@ using PlatformTest::CBundle;
 using PlatformTest::demoInfo;
 using TestSupport::binaryInfo;
 using TestSupport::CPlatformString;
+using TestSupport::layFile;
 using TestSupport::TInfo;
-using TestSupport::writeFile;
 using TestSupport::xmlInfo;
 using TestSupport::xmlPlist;
 
@@ -34,19 +34,19 @@ void expectDemo(CBundle const& bundle) {
 }
 
 void expectNoValues(std::string const& plist) {
-    writeFile(demoInfo, plist);
+    layFile(demoInfo, plist);
     CBundle const bundle("Demo.bundle");
     ASSERT_FALSE(bundle.isNull());
     EXPECT_EQ(bundle.value("CFBundleName"), nothing) << plist;
 }
 
 TEST_F(CFBundleInfoTest, XmlIsRead) {
-    writeFile(demoInfo, xmlInfo(demo));
+    layFile(demoInfo, xmlInfo(demo));
     expectDemo(CBundle("Demo.bundle"));
 }
 
 TEST_F(CFBundleInfoTest, TheBinaryFormIsRead) {
-    writeFile(demoInfo, binaryInfo(demo));
+    layFile(demoInfo, binaryInfo(demo));
     expectDemo(CBundle("Demo.bundle"));
 }
 
@@ -55,7 +55,7 @@ TEST_F(CFBundleInfoTest, TheConstantsNameTheirKeys) {
     EXPECT_EQ(CPlatformString::unitsOf(kCFBundleVersionKey), u"CFBundleVersion");
     EXPECT_EQ(CFStringGetCharactersPtr(kCFBundleNameKey)[12], 0);
 
-    writeFile(demoInfo, xmlInfo(demo));
+    layFile(demoInfo, xmlInfo(demo));
     CBundle const bundle("Demo.bundle");
     CFTypeRef const name = CFBundleGetValueForInfoDictionaryKey(bundle.get(), kCFBundleNameKey);
     CFTypeRef const version =
@@ -73,7 +73,7 @@ TEST_F(CFBundleInfoTest, AConstantIsRetainedAndReleasedLikeAnyString) {
 }
 
 TEST_F(CFBundleInfoTest, AnUnknownKeyHasNoValue) {
-    writeFile(demoInfo, xmlInfo(demo));
+    layFile(demoInfo, xmlInfo(demo));
     CBundle const bundle("Demo.bundle");
     EXPECT_EQ(bundle.value("CFBundleNam"), nothing);
     EXPECT_EQ(bundle.value("cfbundlename"), nothing);
@@ -85,13 +85,13 @@ TEST_F(CFBundleInfoTest, AnUnknownKeyHasNoValue) {
 }
 
 TEST_F(CFBundleInfoTest, OnlyTextsAreValues) {
-    writeFile(demoInfo, xmlPlist("<dict><key>Number</key><integer>3</integer>"
-                                 "<key>Real</key><real>1.5</real><key>Flag</key><true/>"
-                                 "<key>Date</key><date>2021-04-29T08:35:23Z</date>"
-                                 "<key>Data</key><data>QUJD</data>"
-                                 "<key>List</key><array><string>a</string></array>"
-                                 "<key>Inner</key><dict><key>Deep</key><string>b</string></dict>"
-                                 "<key>Text</key><string>c</string></dict>"));
+    layFile(demoInfo, xmlPlist("<dict><key>Number</key><integer>3</integer>"
+                               "<key>Real</key><real>1.5</real><key>Flag</key><true/>"
+                               "<key>Date</key><date>2021-04-29T08:35:23Z</date>"
+                               "<key>Data</key><data>QUJD</data>"
+                               "<key>List</key><array><string>a</string></array>"
+                               "<key>Inner</key><dict><key>Deep</key><string>b</string></dict>"
+                               "<key>Text</key><string>c</string></dict>"));
     CBundle const bundle("Demo.bundle");
     for (char const* const key : {"Number", "Real", "Flag", "Date", "Data", "List", "Inner"})
         EXPECT_EQ(bundle.value(key), nothing) << key;
@@ -100,12 +100,12 @@ TEST_F(CFBundleInfoTest, OnlyTextsAreValues) {
 }
 
 TEST_F(CFBundleInfoTest, EntitiesAreCharacters) {
-    writeFile(demoInfo, xmlInfo({{"CFBundleName", "Fish &amp; &lt;Chips&gt;"}}));
+    layFile(demoInfo, xmlInfo({{"CFBundleName", "Fish &amp; &lt;Chips&gt;"}}));
     EXPECT_EQ(CBundle("Demo.bundle").value("CFBundleName"), u"Fish & <Chips>");
 }
 
 TEST_F(CFBundleInfoTest, ATextThatIsNotUTF8IsNoValue) {
-    writeFile(demoInfo, xmlInfo({{"CFBundleName", "Gr\xFC\xDF"}, {"CFBundleVersion", "1"}}));
+    layFile(demoInfo, xmlInfo({{"CFBundleName", "Gr\xFC\xDF"}, {"CFBundleVersion", "1"}}));
     CBundle const bundle("Demo.bundle");
     EXPECT_EQ(bundle.value("CFBundleName"), nothing);
     EXPECT_EQ(bundle.value("CFBundleVersion"), u"1");
@@ -139,7 +139,7 @@ TEST_F(CFBundleInfoTest, ABrokenInfoPlistHasNoValues) {
 TEST_F(CFBundleInfoTest, AnInfoPlistCutOffAnywhereDoesNoHarm) {
     for (std::string const& whole : {xmlInfo(demo), binaryInfo(demo)}) {
         for (std::size_t size = 0; size < whole.size(); size += 7) {
-            writeFile(demoInfo, whole.substr(0, size));
+            layFile(demoInfo, whole.substr(0, size));
             CBundle const bundle("Demo.bundle");
             ASSERT_FALSE(bundle.isNull());
             std::optional<std::u16string> const name = bundle.value("CFBundleName");
@@ -149,9 +149,9 @@ TEST_F(CFBundleInfoTest, AnInfoPlistCutOffAnywhereDoesNoHarm) {
 }
 
 TEST_F(CFBundleInfoTest, ABundleShowsTheInfoPlistOfItsCreation) {
-    writeFile(demoInfo, xmlInfo({{"CFBundleName", "Old"}}));
+    layFile(demoInfo, xmlInfo({{"CFBundleName", "Old"}}));
     CBundle const before("Demo.bundle");
-    writeFile(demoInfo, xmlInfo({{"CFBundleName", "New"}}));
+    layFile(demoInfo, xmlInfo({{"CFBundleName", "New"}}));
     CBundle const after("Demo.bundle");
     std::filesystem::remove(demoInfo);
     EXPECT_EQ(before.value("CFBundleName"), u"Old");
@@ -159,7 +159,7 @@ TEST_F(CFBundleInfoTest, ABundleShowsTheInfoPlistOfItsCreation) {
 }
 
 TEST_F(CFBundleInfoTest, AValueBelongsToItsBundle) {
-    writeFile(demoInfo, xmlInfo(demo));
+    layFile(demoInfo, xmlInfo(demo));
     CBundle bundle("Demo.bundle");
     CFTypeRef const value = CFBundleGetValueForInfoDictionaryKey(bundle.get(), kCFBundleNameKey);
     EXPECT_EQ(value, CFBundleGetValueForInfoDictionaryKey(bundle.get(), kCFBundleNameKey));

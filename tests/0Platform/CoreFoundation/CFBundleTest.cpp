@@ -17,8 +17,8 @@ using PlatformTest::demoExecutable;
 using PlatformTest::demoInfo;
 using TestSupport::copyLibrary;
 using TestSupport::CPlatformString;
+using TestSupport::layFile;
 using TestSupport::moduleEvents;
-using TestSupport::writeFile;
 using TestSupport::xmlInfo;
 
 namespace {
@@ -102,7 +102,7 @@ class CFBundleTest : public PlatformTest::CBundleTest {
 
 TEST_F(CFBundleTest, AFolderIsABundleWhateverLiesInIt) {
     fs::create_directory("Empty");
-    writeFile("Other/file", "text");
+    layFile("Other/file", "text");
     EXPECT_FALSE(CBundle("Empty").isNull());
     EXPECT_FALSE(CBundle("Other").isNull());
     EXPECT_FALSE(CBundle("Other/").isNull());
@@ -113,7 +113,7 @@ TEST_F(CFBundleTest, AFolderIsABundleWhateverLiesInIt) {
 
 TEST_F(CFBundleTest, WhatIsNoFolderIsNoBundle) {
     copyLibrary("First", "First.so");
-    writeFile("file", "");
+    layFile("file", "");
     fs::create_symlink("nowhere", "dangling");
     EXPECT_TRUE(CBundle("missing").isNull());
     EXPECT_TRUE(CBundle("First.so").isNull());
@@ -149,7 +149,7 @@ TEST_F(CFBundleTest, OneExtensionOfTheFolderIsLeftOut) {
     for (CCase const& names :
          {CCase{"Plain", "Plain"}, CCase{"Two.tar.gz", "Two.tar"}, CCase{".hidden", ".hidden"},
           CCase{"dot.", "dot."}, CCase{"caf\xC3\xA9.bundle", "caf\xC3\xA9"}}) {
-        writeFile(std::string(names.folder) + "/Contents/Linux/" + names.executable, "");
+        layFile(std::string(names.folder) + "/Contents/Linux/" + names.executable, "");
         CPlatformString const expected(names.executable, kCFStringEncodingUTF8);
         EXPECT_EQ(CBundle(names.folder).executable(), expected.units()) << names.folder;
         EXPECT_EQ(CBundle(std::string(names.folder) + "/").executable(), expected.units());
@@ -159,7 +159,7 @@ TEST_F(CFBundleTest, OneExtensionOfTheFolderIsLeftOut) {
 TEST_F(CFBundleTest, InfoPlistNamesTheExecutable) {
     copyLibrary("First", demoExecutable);
     copyLibrary("Second", "Demo.bundle/Contents/Linux/libother.so");
-    writeFile(demoInfo, xmlInfo({{"CFBundleExecutable", "libother.so"}}));
+    layFile(demoInfo, xmlInfo({{"CFBundleExecutable", "libother.so"}}));
     CBundle const bundle("Demo.bundle");
     EXPECT_EQ(bundle.executable(), u"libother.so");
     EXPECT_EQ(bundle.libraryName(), "Second");
@@ -167,7 +167,7 @@ TEST_F(CFBundleTest, InfoPlistNamesTheExecutable) {
 
 TEST_F(CFBundleTest, AnExecutableThatInfoPlistNamesInVainIsNotReplaced) {
     copyLibrary("First", demoExecutable);
-    writeFile(demoInfo, xmlInfo({{"CFBundleExecutable", "missing"}}));
+    layFile(demoInfo, xmlInfo({{"CFBundleExecutable", "missing"}}));
     CBundle const bundle("Demo.bundle");
     EXPECT_EQ(bundle.executable(), nothing);
     EXPECT_FALSE(bundle.load());
@@ -175,7 +175,7 @@ TEST_F(CFBundleTest, AnExecutableThatInfoPlistNamesInVainIsNotReplaced) {
 
 TEST_F(CFBundleTest, AnEmptyNameInInfoPlistCountsAsNone) {
     copyLibrary("First", demoExecutable);
-    writeFile(demoInfo, xmlInfo({{"CFBundleExecutable", ""}}));
+    layFile(demoInfo, xmlInfo({{"CFBundleExecutable", ""}}));
     EXPECT_EQ(CBundle("Demo.bundle").executable(), u"Demo");
 }
 
@@ -300,7 +300,7 @@ TEST_F(CFBundleTest, SymbolsAreKeptFromOtherLibraries) {
 TEST_F(CFBundleTest, WhatIsNoLibraryIsNotLoaded) {
     std::string const whole = TestSupport::readFile(TestSupport::libraryFolder() + "/First.so");
     for (std::string const& bytes : {std::string(), std::string("text\n"), whole.substr(0, 100)}) {
-        writeFile(demoExecutable, bytes);
+        layFile(demoExecutable, bytes);
         CBundle const bundle("Demo.bundle");
         EXPECT_EQ(bundle.executable(), u"Demo");
         EXPECT_FALSE(bundle.load());
@@ -366,7 +366,7 @@ bool use(CFStringRef path, CFStringRef functionName) {
 // Each allocation in its turn is the one that fails.
 TEST_F(CFBundleTest, ShortMemoryLeavesNothingBehind) {
     copyLibrary("First", demoExecutable);
-    writeFile(demoInfo, xmlInfo({{"CFBundleName", "Demo"}}));
+    layFile(demoInfo, xmlInfo({{"CFBundleName", "Demo"}}));
     CPlatformString const path(u"Demo.bundle");
     CPlatformString const function(u"libraryName");
     long const before = TestSupport::liveObjects();

@@ -23,10 +23,10 @@ using ModulesTest::libraryName;
 using ModulesTest::openHandles;
 using ModulesTest::TCalls;
 using TestSupport::copyLibrary;
+using TestSupport::layFile;
 using TestSupport::moduleEvents;
 using TestSupport::readFile;
 using TestSupport::TParameters;
-using TestSupport::writeFile;
 
 namespace {
 
@@ -80,8 +80,8 @@ TEST_F(CModulesDyLibFailuresTest, APathThatDoesNotExist) {
 }
 
 TEST_F(CModulesDyLibFailuresTest, AFileThatIsNoLibrary) {
-    writeFile("empty.so", "");
-    writeFile("text.so", "INPUT(libm.so.6)\n");
+    layFile("empty.so", "");
+    layFile("text.so", "INPUT(libm.so.6)\n");
     expectNotFound(L"./empty.so", "./empty.so");
     expectNotFound(L"./text.so", "./text.so");
     fs::create_symlink("link", "link");
@@ -92,7 +92,7 @@ TEST_F(CModulesDyLibFailuresTest, ALibraryThatIsCutOff) {
     std::string const whole = firstLibrary();
     for (std::size_t const size : {std::size_t(4), sizeof(Elf64_Ehdr) - 1, sizeof(Elf64_Ehdr),
                                    sizeof(Elf64_Ehdr) + sizeof(Elf64_Phdr)}) {
-        writeFile("cut.so", whole.substr(0, size));
+        layFile("cut.so", whole.substr(0, size));
         expectNotFound(L"./cut.so", "./cut.so");
     }
 }
@@ -101,17 +101,17 @@ TEST_F(CModulesDyLibFailuresTest, ALibraryOfAnotherMachine) {
     std::string machine = firstLibrary();
     auto const other = static_cast<Elf64_Half>(EM_PPC64);
     std::memcpy(&machine[offsetof(Elf64_Ehdr, e_machine)], &other, sizeof(other));
-    writeFile("machine.so", machine);
+    layFile("machine.so", machine);
     expectNotFound(L"./machine.so", "./machine.so");
 
     std::string width = firstLibrary();
     width[EI_CLASS] = ELFCLASS32;
-    writeFile("width.so", width);
+    layFile("width.so", width);
     expectNotFound(L"./width.so", "./width.so");
 
     std::string order = firstLibrary();
     order[EI_DATA] = ELFDATA2MSB;
-    writeFile("order.so", order);
+    layFile("order.so", order);
     expectNotFound(L"./order.so", "./order.so");
 }
 
@@ -136,9 +136,9 @@ TEST_F(CModulesDyLibFailuresTest, AFolderWithoutAnExecutable) {
 }
 
 TEST_F(CModulesDyLibFailuresTest, ABundleWhoseExecutableCanNotBeLoaded) {
-    writeFile("Demo.bundle/Contents/Info.plist",
-              TestSupport::xmlInfo({{"CFBundleName", "Demo"}, {"CFBundleVersion", "1"}}));
-    writeFile("Demo.bundle/Contents/Linux/Demo", firstLibrary().substr(0, 100));
+    layFile("Demo.bundle/Contents/Info.plist",
+            TestSupport::xmlInfo({{"CFBundleName", "Demo"}, {"CFBundleVersion", "1"}}));
+    layFile("Demo.bundle/Contents/Linux/Demo", firstLibrary().substr(0, 100));
     expectNotFound(L"./Demo.bundle", "./Demo.bundle");
 
     CLoaderCalls const calls;
@@ -149,7 +149,7 @@ TEST_F(CModulesDyLibFailuresTest, ABundleWhoseExecutableCanNotBeLoaded) {
 }
 
 TEST_F(CModulesDyLibFailuresTest, ABundleThatFailsLeavesTheHandle) {
-    writeFile("Second.so/Contents/Linux/Second", "no library");
+    layFile("Second.so/Contents/Linux/Second", "no library");
     long const liveBefore = TestSupport::liveObjects();
     Modules::TLibraryRef const library = loadLibrary(L"Second.so", 0);
     EXPECT_EQ(library.first, nullptr);

@@ -19,8 +19,8 @@ using ModulesTest::libraryName;
 using ModulesTest::openHandles;
 using ModulesTest::TCalls;
 using TestSupport::copyLibrary;
+using TestSupport::layFile;
 using TestSupport::moduleEvents;
-using TestSupport::writeFile;
 
 extern "C" void qornModuleEvent(char const* event);
 
@@ -35,8 +35,8 @@ constexpr wchar_t const* both = L"Second.so";
 
 void makeBundle(std::string const& library, std::string const& folder) {
     copyLibrary(library, folder + "/Contents/Linux/Main");
-    writeFile(folder + "/Contents/Info.plist",
-              TestSupport::xmlInfo({{"CFBundleExecutable", "Main"}}));
+    layFile(folder + "/Contents/Info.plist",
+            TestSupport::xmlInfo({{"CFBundleExecutable", "Main"}}));
 }
 
 // --- which loader holds what
@@ -65,9 +65,9 @@ TEST_F(CModulesDyLibTest, BothFormsOfInfoPlistNameTheExecutable) {
     copyLibrary("First", "First.bundle/Contents/Linux/Main");
     copyLibrary("Second", "First.bundle/Contents/Linux/Other");
     std::string const plist = "First.bundle/Contents/Info.plist";
-    writeFile(plist, TestSupport::xmlInfo({{"CFBundleExecutable", "Main"}}));
+    layFile(plist, TestSupport::xmlInfo({{"CFBundleExecutable", "Main"}}));
     EXPECT_EQ(libraryName(CDyLib(L"First.bundle", 0)), "First");
-    writeFile(plist, TestSupport::binaryInfo({{"CFBundleExecutable", "Other"}}));
+    layFile(plist, TestSupport::binaryInfo({{"CFBundleExecutable", "Other"}}));
     EXPECT_EQ(libraryName(CDyLib(L"First.bundle", 0)), "Second");
 }
 

@@ -1,21 +1,12 @@
 #include "support/TestLibraries/TestLibraries.h"
 
-#include <cstdlib>
 #include <filesystem>
-#include <fstream>
-#include <iterator>
-#include <stdexcept>
 
 namespace fs = std::filesystem;
 
 namespace {
 
 std::vector<std::string> events;
-
-void makeFolderOf(fs::path const& file) {
-    if (file.has_parent_path())
-        fs::create_directories(file.parent_path());
-}
 
 } // namespace
 
@@ -28,8 +19,7 @@ void qornModuleEvent(char const* event) {
 namespace TestSupport {
 
 void copyLibrary(std::string const& name, std::string const& file) {
-    makeFolderOf(file);
-    fs::copy_file(libraryFolder() + "/" + name + ".so", file);
+    layFile(file, readFile(libraryFolder() + "/" + name + ".so"));
 }
 
 std::string libraryFolder() {
@@ -40,29 +30,18 @@ std::vector<std::string> const& moduleEvents() {
     return events;
 }
 
-void writeFile(std::string const& file, std::string const& bytes) {
-    makeFolderOf(file);
-    std::ofstream(file, std::ios_base::binary) << bytes;
+void layFile(std::string const& file, std::string const& content) {
+    makeFolders(fs::path(file).parent_path());
+    writeFile(file, content);
 }
 
-std::string readFile(std::string const& file) {
-    std::ifstream stream(file, std::ios_base::binary);
-    return std::string(std::istreambuf_iterator<char>(stream), {});
-}
-
-CEmptyFolder::CEmptyFolder() : before_(fs::current_path()) {
-    char const* const parent = std::getenv("TMPDIR");
-    folder_ = std::string(parent != nullptr && *parent != '\0' ? parent : "/tmp") + "/qorn-XXXXXX";
-    if (::mkdtemp(folder_.data()) == nullptr)
-        throw std::runtime_error("no temporary folder");
-    fs::current_path(folder_);
-    folder_ = fs::current_path();
+CEmptyFolder::CEmptyFolder() {
+    fs::current_path(root_.path());
     events.clear();
 }
 
 CEmptyFolder::~CEmptyFolder() {
-    fs::current_path(before_);
-    fs::remove_all(folder_);
+    fs::current_path("/");
 }
 
 } // namespace TestSupport

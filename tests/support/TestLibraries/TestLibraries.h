@@ -6,6 +6,8 @@
 #ifndef QORN_TESTS_TESTLIBRARIES_H
 #define QORN_TESTS_TESTLIBRARIES_H
 
+#include "support/FileRoot.h"
+
 #include <string>
 #include <vector>
 
@@ -28,12 +30,11 @@ std::string libraryFolder();
 /// since the last CEmptyFolder was made.
 std::vector<std::string> const& moduleEvents();
 
-/// Files, with the folders that they lie in.
-void writeFile(std::string const& file, std::string const& bytes);
-std::string readFile(std::string const& file);
+/// Writes a file, and makes the folders that it lies in.
+void layFile(std::string const& file, std::string const& content);
 
-/// While it lives, the working directory is an empty folder of its own, so that the name of the
-/// temporary folder may be of any bytes.
+/// While it lives, the working directory is the file root's empty folder, so that files are named
+/// from there and the name of the temporary folder may be of any bytes.
 class CEmptyFolder {
   public:
     CEmptyFolder();
@@ -42,8 +43,7 @@ class CEmptyFolder {
     CEmptyFolder& operator=(CEmptyFolder const&) = delete;
 
   private:
-    std::string before_;
-    std::string folder_;
+    CFileRoot const root_;
 };
 
 } // namespace TestSupport
