@@ -227,6 +227,17 @@ TEST_F(CFBundleTest, TheExecutableIsLoadedOnceAndUnloadedOnce) {
     EXPECT_EQ(openHandles, 0);
 }
 
+TEST_F(CFBundleTest, ALoadedExecutableNeedsItsFileNoMore) {
+    copyLibrary("First", demoExecutable);
+    CBundle const bundle("Demo.bundle");
+    EXPECT_TRUE(bundle.load());
+    fs::remove_all("Demo.bundle");
+    EXPECT_TRUE(bundle.load());
+    EXPECT_EQ(bundle.libraryName(), "First");
+    bundle.unload();
+    EXPECT_FALSE(bundle.load());
+}
+
 TEST_F(CFBundleTest, AnUnloadedExecutableIsLoadedAnew) {
     copyLibrary("First", demoExecutable);
     CBundle const bundle("Demo.bundle");
