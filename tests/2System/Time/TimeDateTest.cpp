@@ -1,10 +1,11 @@
 // Dates as values: how they are made, what they tell, how they compare and what they look like.
 
 #include "2System/Time/TimeDate.h"
+#include "2System/Time/TimeDateTime.h"
+#include "2System/Time/_Imp/TimeNames.h"
 
 #include "2System/Time/TimeDateFields.h"
 #include "2System/Time/TimeFailure.h"
-#include "2System/Time/_Imp/TimeNames.h"
 #include "support/LogRecorder.h"
 #include "support/Registry.h"
 #include "support/TextFailures.h"
@@ -65,6 +66,11 @@ TEST_F(CTimeDateTest, AStructOfTheCLibraryIsNotTested) {
     time.tm_mon = INT_MAX;
     time.tm_year = INT_MAX;
     EXPECT_EQ(fieldsOf(CDate(time)), TFields(99, INT_MIN, INT_MIN + 1899));
+}
+
+TEST_F(CTimeDateTest, ADateTimeGivesItsDate) {
+    Time::CDateTime const dateTime(Time::CTime(8, 5, 9, 123), uncheckedDate(31, 2, 2021));
+    EXPECT_EQ(fieldsOf(CDate(dateTime)), TFields(31, 2, 2021));
 }
 
 TEST_F(CTimeDateTest, ADateThatIsNoneIsLoggedAndRaised) {

@@ -19,8 +19,8 @@ using TimeTest::CTimeFailure;
 using TimeTest::timeFailureOf;
 using TimeTest::uncheckedDate;
 
-class CTimeDateWeekdayTest : public TestSupport::CErrorTest,
-                             public testing::WithParamInterface<char const*> {};
+class CTimeDateWeekdayInZonesTest : public TestSupport::CErrorTest,
+                                    public testing::WithParamInterface<char const*> {};
 
 constexpr int unknown = -1;
 
@@ -41,7 +41,7 @@ int weekdayOf(int day, int month, int year) {
 }
 
 // In some zones there was a midnight that their clocks left out; the C library can't tell then.
-TEST_P(CTimeDateWeekdayTest, AWeekdayIsTheOneOfMktimeWithAllElseZero) {
+TEST_P(CTimeDateWeekdayInZonesTest, AWeekdayIsTheOneOfMktimeWithAllElseZero) {
     TestSupport::CZone const zone(GetParam());
     for (int year = 1890; year <= 2060; ++year)
         for (int month = 1; month <= 12; ++month)
@@ -50,19 +50,20 @@ TEST_P(CTimeDateWeekdayTest, AWeekdayIsTheOneOfMktimeWithAllElseZero) {
                     << day << '.' << month << '.' << year;
 }
 
-TEST_P(CTimeDateWeekdayTest, WhatIsNoDateHasAWeekdayToo) {
+TEST_P(CTimeDateWeekdayInZonesTest, WhatIsNoDateHasAWeekdayToo) {
     TestSupport::CZone const zone(GetParam());
     EXPECT_EQ(weekdayOf(31, 2, 2021), weekdayByMktime(31, 2, 2021));
     EXPECT_EQ(weekdayOf(15, 0, 2023), weekdayByMktime(15, 0, 2023));
     EXPECT_EQ(weekdayOf(-1, 65537, 2021), weekdayByMktime(-1, 65537, 2021));
 }
 
-INSTANTIATE_TEST_SUITE_P(Zones, CTimeDateWeekdayTest, testing::ValuesIn(TestSupport::zonesToTry),
+INSTANTIATE_TEST_SUITE_P(Zones, CTimeDateWeekdayInZonesTest,
+                         testing::ValuesIn(TestSupport::zonesToTry),
                          [](auto const& zone) { return std::to_string(zone.index); });
 
-using CTimeDateWeekdayFailureTest = TestSupport::CErrorTest;
+using CTimeDateWeekdayTest = TestSupport::CErrorTest;
 
-TEST_F(CTimeDateWeekdayFailureTest, WeekdaysAreCountedFromSunday) {
+TEST_F(CTimeDateWeekdayTest, WeekdaysAreCountedFromSunday) {
     for (char const* const name : {"UTC", "Asia/Kolkata", "America/New_York", "Pacific/Apia"}) {
         TestSupport::CZone const zone(name);
         EXPECT_EQ(CDate(5, CDate::emMar, 2021).getDayOfWeek(), CDate::ewdFri) << name;
@@ -73,14 +74,14 @@ TEST_F(CTimeDateWeekdayFailureTest, WeekdaysAreCountedFromSunday) {
 
 // Standard time is the one of summer there. Where the zone files say so, midnight without summer
 // time is, in winter, an hour of the day before.
-TEST_F(CTimeDateWeekdayFailureTest, NegativeSummerTimeShowsInTheWeekday) {
+TEST_F(CTimeDateWeekdayTest, NegativeSummerTimeShowsInTheWeekday) {
     TestSupport::CZone const zone("IST-1GMT0,M10.5.0,M3.5.0/1");
     EXPECT_EQ(CDate(5, CDate::emMar, 2021).getDayOfWeek(), CDate::ewdThu);
     EXPECT_EQ(CDate(4, CDate::emJun, 2021).getDayOfWeek(), CDate::ewdFri);
 }
 
 // A second behind Greenwich, 1 January 1970 began at the moment -1, which means failure.
-TEST_F(CTimeDateWeekdayFailureTest, AMomentThatLooksLikeAFailureIsOne) {
+TEST_F(CTimeDateWeekdayTest, AMomentThatLooksLikeAFailureIsOne) {
     TestSupport::CZone const zone("AAA-0:00:01");
     EXPECT_EQ(timeFailureOf([] { CDate(1, CDate::emJan, 1970).getDayOfWeek(); }),
               (CTimeFailure{L"Error in OS call @(function): @(error)",
@@ -89,7 +90,7 @@ TEST_F(CTimeDateWeekdayFailureTest, AMomentThatLooksLikeAFailureIsOne) {
     EXPECT_EQ(CDate(2, CDate::emJan, 1970).getDayOfWeek(), CDate::ewdFri);
 }
 
-TEST_F(CTimeDateWeekdayFailureTest, WhatTheCLibraryCannotHoldIsAFailure) {
+TEST_F(CTimeDateWeekdayTest, WhatTheCLibraryCannotHoldIsAFailure) {
     TestSupport::CZone const zone("UTC");
     EXPECT_EQ(timeFailureOf([] { uncheckedDate(31, 12, INT32_MAX).getDayOfWeek(); }).text, L"");
     EXPECT_EQ(

@@ -2,6 +2,7 @@
 // compile.
 
 #include "2System/Time/TimeDate.h"
+#include "2System/Time/TimeDateTime.h"
 #include "2System/Time/TimeExc.h"
 #include "2System/Time/TimeTime.h"
 
@@ -45,6 +46,7 @@ static_assert(std::is_constructible_v<CDate, CDate::TDay, CDate::EMonth, CDate::
 static_assert(!std::is_constructible_v<CDate, int, int, int>, "a month is named");
 static_assert(std::is_constructible_v<CDate, string const&, string const&, string const&>);
 static_assert(std::is_constructible_v<CDate, std::tm>);
+static_assert(std::is_constructible_v<CDate, Time::CDateTime const&>);
 static_assert(!std::is_default_constructible_v<CDate>);
 static_assert(isOverload<bool (*)(int, CDate::EMonth, int)>(CDate::isValid));
 static_assert(isOverload<int (CDate::*)() const>(&CDate::getDay));
@@ -86,6 +88,7 @@ static_assert(isOverload<std::wostream& (*)(std::wostream&, CDate const&)>(Time:
 
 static_assert(std::is_constructible_v<CTime, int, int, int, int>);
 static_assert(std::is_constructible_v<CTime, std::tm>);
+static_assert(std::is_constructible_v<CTime, Time::CDateTime const&>);
 static_assert(isOverload<CTime (*)(int)>(CTime::milliSecondsToTimeFormat));
 static_assert(isOverload<CTime (*)(int)>(CTime::secondsToTimeFormat));
 static_assert(isOverload<int (CTime::*)() const>(&CTime::getHour));

@@ -1,6 +1,7 @@
 // Times of day as values, what is reckoned with them, and offsets from UTC.
 
 #include "2System/Time/TimeTime.h"
+#include "2System/Time/TimeDateTime.h"
 
 #include "support/Registry.h"
 
@@ -64,6 +65,11 @@ TEST_F(CTimeTimeTest, AStructOfTheCLibraryHasNoMilliseconds) {
     time.tm_min = 5;
     time.tm_sec = 60;
     EXPECT_EQ(fieldsOf(CTime(time)), (TFields{25, 5, 60, 0}));
+}
+
+TEST_F(CTimeTimeTest, ADateTimeGivesItsTime) {
+    Time::CDateTime const dateTime(5, Time::CDate::emMar, 2021, 8, 5, 9, 123);
+    EXPECT_EQ(fieldsOf(CTime(dateTime)), (TFields{8, 5, 9, 123}));
 }
 
 TEST_F(CTimeTimeTest, MillisecondsAreSplit) {
