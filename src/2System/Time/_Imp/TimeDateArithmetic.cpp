@@ -21,15 +21,19 @@ using Detail::maxDaysInMonth;
 constexpr CDate::TYear firstYear = std::numeric_limits<CDate::TYear>::min();
 constexpr CDate::TYear lastYear = std::numeric_limits<CDate::TYear>::max();
 
+void assertMonth(CDate::EMonth month) {
+    // As a value the text would be a pointer that a compiler warns of.
+    Error::Detail::CAsserter_<true, true>::do_assert(ERROR_ORIGIN, checkMonth(month),
+                                                     "!\"Invalid month!\"", ERROR_PARAM(month));
+}
+
 CDate::EMonth& operator++(CDate::EMonth& month) {
-    if (!checkMonth(month))
-        ERROR_ASSERT_P(ERROR_PARAM(month), !"Invalid month!");
+    assertMonth(month);
     return month = month == CDate::emDec ? CDate::emJan : static_cast<CDate::EMonth>(month + 1);
 }
 
 CDate::EMonth& operator--(CDate::EMonth& month) {
-    if (!checkMonth(month))
-        ERROR_ASSERT_P(ERROR_PARAM(month), !"Invalid month!");
+    assertMonth(month);
     return month = month == CDate::emJan ? CDate::emDec : static_cast<CDate::EMonth>(month - 1);
 }
 
