@@ -5,6 +5,7 @@
 #include "2System/Time/TimeDateFields.h"
 #include "2System/Time/TimeFailure.h"
 #include "2System/Time/TimeReading.h"
+#include "2System/Time/TimeScanner.h"
 #include "support/LogRecorder.h"
 #include "support/Registry.h"
 
@@ -33,12 +34,8 @@ using TReading = TimeTest::CReading<3>;
 using CTimeDateInputTest = TestSupport::CErrorTest;
 
 TReading reading(std::string const& text) {
-    auto const read = [](auto& stream) {
-        CDate const date = CDate::readDate(stream);
-        return std::array<int, 3>{date.getDay(), date.getMonth(), date.getYear()};
-    };
-    TReading const narrow = TimeTest::readingOf<char>(text, read);
-    EXPECT_EQ(narrow, TimeTest::readingOf<wchar_t>(text, read)) << text;
+    TReading const narrow = TimeTest::readingOf<char>(text, TimeTest::readDateFields);
+    EXPECT_EQ(narrow, TimeTest::readingOf<wchar_t>(text, TimeTest::readDateFields)) << text;
     return narrow;
 }
 

@@ -4,6 +4,7 @@
 
 #include "2System/Time/TimeFailure.h"
 #include "2System/Time/TimeReading.h"
+#include "2System/Time/TimeScanner.h"
 #include "support/Registry.h"
 
 #include <gtest/gtest.h>
@@ -24,13 +25,8 @@ using TReading = TimeTest::CReading<4>;
 using CTimeTimeInputTest = TestSupport::CErrorTest;
 
 TReading reading(std::string const& text) {
-    auto const read = [](auto& stream) {
-        CTime const time = CTime::readTime(stream);
-        return std::array<int, 4>{time.getHour(), time.getMinute(), time.getSecond(),
-                                  time.getMilliSecond()};
-    };
-    TReading const narrow = TimeTest::readingOf<char>(text, read);
-    EXPECT_EQ(narrow, TimeTest::readingOf<wchar_t>(text, read)) << text;
+    TReading const narrow = TimeTest::readingOf<char>(text, TimeTest::readTimeFields);
+    EXPECT_EQ(narrow, TimeTest::readingOf<wchar_t>(text, TimeTest::readTimeFields)) << text;
     return narrow;
 }
 
