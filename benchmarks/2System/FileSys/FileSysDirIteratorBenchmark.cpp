@@ -3,7 +3,7 @@
 
 #include "2System/FileSys/FileSysDirIterator.h"
 
-#include "FileSysTrees.h"
+#include "2System/FileSys/FileSysTrees.h"
 #include "support/Benchmark.h"
 
 #include <boost/filesystem.hpp>

@@ -4,7 +4,7 @@
 #include "2System/FileSys/FileSysOperations.h"
 #include "2System/FileSys/FileSysTempFile.h"
 
-#include "FileSysTrees.h"
+#include "2System/FileSys/FileSysTrees.h"
 #include "support/Benchmark.h"
 
 #include <boost/filesystem.hpp>

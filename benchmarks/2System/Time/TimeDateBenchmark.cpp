@@ -2,7 +2,7 @@
 
 #include "2System/Time/TimeDate.h"
 
-#include "TimeMoments.h"
+#include "2System/Time/TimeMoments.h"
 
 #include <boost/date_time/gregorian/gregorian_types.hpp>
 

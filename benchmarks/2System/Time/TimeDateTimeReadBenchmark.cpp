@@ -3,7 +3,7 @@
 
 #include "2System/Time/TimeDateTime.h"
 
-#include "TimeMoments.h"
+#include "2System/Time/TimeMoments.h"
 
 #ifdef QORN_HAVE_ABSL
 #    include <absl/time/time.h>
