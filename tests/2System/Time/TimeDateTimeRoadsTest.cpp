@@ -1,0 +1,346 @@
+// Random values and texts by both roads: by hand, and by a stream. Whatever comes out has to be the
+// same, failures and masks included.
+
+#include "1Base/Error/Error.h"
+#include "2System/Time/TimeDateTime.h"
+#include "2System/Time/TimeOutcome.h"
+#include "2System/Time/TimeRoads.h"
+#include "support/ObjectCount.h"
+
+#include <cstddef>
+#include <iomanip>
+#include <limits>
+#include <random>
+#include <sstream>
+#include <string>
+#include <tuple>
+#include <vector>
+
+namespace {
+
+using Time::CDateTime;
+using Time::CTimeZone;
+using TimeTest::CStreamRoad;
+
+constexpr unsigned int seed = 20210305;
+
+class CTimeDateTimeRoadsTest : public TestSupport::CObjectCountTest {
+  protected:
+    std::size_t below(std::size_t limit) {
+        return std::uniform_int_distribution<std::size_t>(0, limit - 1)(random_);
+    }
+
+    bool oneIn(std::size_t count) { return below(count) == 0; }
+
+    template <class TText>
+    typename TText::value_type oneOf(TText const& text) {
+        return text[below(text.size())];
+    }
+
+    std::mt19937 random_{seed};
+};
+
+// Runs `make` and then `outcome` on what it made, by hand and by a stream.
+template <class TMake, class TOutcome>
+void compareRoads(std::size_t rounds, TMake const& make, TOutcome const& outcome) {
+    constexpr std::size_t inARound = 1000;
+    for (std::size_t round = 0; round < rounds; ++round) {
+        using TInput = decltype(make());
+        std::vector<TInput> inputs;
+        std::vector<decltype(outcome(inputs[0]))> byHand;
+        for (std::size_t i = 0; i < inARound; ++i) {
+            inputs.push_back(make());
+            byHand.push_back(outcome(inputs.back()));
+        }
+        CStreamRoad const stream;
+        for (std::size_t i = 0; i < inARound; ++i)
+            ASSERT_EQ(outcome(inputs[i]), byHand[i])
+                << "seed " << seed << ", " << testing::PrintToString(inputs[i]);
+    }
+}
+
+// Reading.
+
+constexpr CDateTime::TParts untouched = 0x5555;
+
+using TFields = std::tuple<int, int, int, int, int, int, int>;
+
+// Everything that a reader leaves behind.
+struct CRead {
+    TFields value;
+    std::tuple<int, int, int> zone;
+    CDateTime::TParts parts = untouched;
+    std::string failure;
+
+    bool operator==(CRead const& other) const {
+        return value == other.value && zone == other.zone && parts == other.parts &&
+               failure == other.failure;
+    }
+};
+
+std::ostream& operator<<(std::ostream& stream, CRead const& read) {
+    return stream << testing::PrintToString(read.value) << testing::PrintToString(read.zone)
+                  << read.parts << read.failure;
+}
+
+TFields fieldsOf(CDateTime const& value) {
+    return {value.getYear(),   value.getMonth(),  value.getDay(),        value.getHour(),
+            value.getMinute(), value.getSecond(), value.getMilliSecond()};
+}
+
+template <class TReader>
+CRead outcomeOf(TReader const& reader) {
+    CRead read;
+    CTimeZone zone(CTimeZone::etzPlus, 7, 7);
+    try {
+        read.value = fieldsOf(reader(zone, &read.parts));
+    } catch (Error::CException const& exc) {
+        read.failure = TimeTest::show(exc);
+    }
+    read.zone = {zone.type, zone.hours, zone.minutes};
+    return read;
+}
+
+CRead readISO(std::string const& text) {
+    return outcomeOf([&](CTimeZone& zone, CDateTime::TParts* parts) {
+        return CDateTime::readDateTimeFromISO(text, zone, false, 'T', parts);
+    });
+}
+
+CRead readPDF(std::string const& text) {
+    return outcomeOf([&](CTimeZone& zone, CDateTime::TParts* parts) {
+        return CDateTime::readDateTimeFromPDF(text, zone, false, parts);
+    });
+}
+
+class CTimeDateTimeReadingRoadsTest : public CTimeDateTimeRoadsTest {
+  protected:
+    // A number that may be none, or too long.
+    std::string number(std::size_t limit, std::size_t width) {
+        std::string digits = std::to_string(below(limit));
+        if (digits.size() < width)
+            digits.insert(0, width - digits.size(), '0');
+        return digits;
+    }
+
+    // One character more, less or in the place of another, now and then.
+    std::string spoilt(std::string text) {
+        using namespace std::string_literals;
+        static std::string const characters = "0123456789 +-:.'TZDx\t\0\xC3"s;
+        while (oneIn(3) && !text.empty()) {
+            std::size_t const pos = below(text.size());
+            switch (below(3)) {
+            case 0:
+                text[pos] = oneOf(characters);
+                break;
+            case 1:
+                text.insert(pos, 1, oneOf(characters));
+                break;
+            default:
+                text.erase(pos, 1);
+            }
+        }
+        if (oneIn(3))
+            text.resize(below(text.size() + 1));
+        return text;
+    }
+
+    std::string isoText() {
+        std::string text =
+            number(10001, 4) + '-' + number(14, 2) + '-' + number(33, 2) + 'T' + number(30, 2);
+        text += ':' + number(70, 2);
+        if (!oneIn(4))
+            text += ':' + number(70, 2);
+        if (oneIn(2))
+            text += '.' + number(100, 2);
+        return spoilt(text + isoZone());
+    }
+
+    std::string isoZone() {
+        switch (below(4)) {
+        case 0:
+            return "";
+        case 1:
+            return "Z";
+        case 2:
+            return oneOf(signs) + number(24, 2);
+        default:
+            return oneOf(signs) + number(24, 2) + ':' + number(60, 2);
+        }
+    }
+
+    std::string pdfText() {
+        std::string text = oneIn(4) ? "" : "D:";
+        text += number(10001, 4);
+        for (std::size_t const limit : {14, 33, 30, 70, 70})
+            if (!oneIn(10))
+                text += number(limit, 2);
+        return spoilt(text + pdfZone());
+    }
+
+    std::string pdfZone() {
+        switch (below(4)) {
+        case 0:
+            return "";
+        case 1:
+            return "Z";
+        case 2:
+            return oneOf(signs) + number(3, 2) + '\'' + number(3, 2);
+        default:
+            return oneOf(signs) + number(24, 2) + '\'' + number(60, 2) + '\'';
+        }
+    }
+
+    std::string const signs = "+-";
+};
+
+TEST_F(CTimeDateTimeReadingRoadsTest, ISODates) {
+    std::size_t dates = 0;
+    compareRoads(
+        500, [this] { return isoText(); },
+        [&dates](std::string const& text) {
+            CRead const read = readISO(text);
+            dates += read.failure.empty();
+            return read;
+        });
+    EXPECT_GT(dates, 2 * 100000U) << "too few of the texts were dates";
+}
+
+TEST_F(CTimeDateTimeReadingRoadsTest, PDFDates) {
+    std::size_t dates = 0;
+    compareRoads(
+        500, [this] { return pdfText(); },
+        [&dates](std::string const& text) {
+            CRead const read = readPDF(text);
+            dates += read.failure.empty();
+            return read;
+        });
+    EXPECT_GT(dates, 2 * 100000U) << "too few of the texts were dates";
+}
+
+TEST_F(CTimeDateTimeReadingRoadsTest, ShortTextsOfTheCharactersThatCount) {
+    auto const make = [this] {
+        std::string text;
+        for (std::size_t count = below(9); count > 0; --count)
+            text += oneOf(std::string("01- +:"));
+        return text;
+    };
+    compareRoads(150, make, readISO);
+    compareRoads(150, make, readPDF);
+}
+
+TEST_F(CTimeDateTimeReadingRoadsTest, ZonesOfTheCharactersThatCount) {
+    auto const zone = [this] {
+        std::string text;
+        for (std::size_t count = below(8); count > 0; --count)
+            text += oneOf(std::string("012+-:' Z"));
+        return text;
+    };
+    compareRoads(
+        150, [&] { return "2021-03-05T12:30" + zone(); }, readISO);
+    compareRoads(
+        150, [&] { return "D:20210305123045" + zone(); }, readPDF);
+}
+
+// Writing.
+
+class CTimeDateTimeWritingRoadsTest : public CTimeDateTimeRoadsTest {
+  protected:
+    // Mostly as it should be, at times any number.
+    int field(int first, int last) {
+        using TLimits = std::numeric_limits<int>;
+        if (oneIn(8))
+            return std::uniform_int_distribution<int>(-110, 110)(random_);
+        if (oneIn(40))
+            return std::uniform_int_distribution<int>(TLimits::min(), TLimits::max())(random_);
+        return std::uniform_int_distribution<int>(first, last)(random_);
+    }
+
+    CDateTime value() {
+        std::tm time = {};
+        time.tm_year = Config::wrapSub(field(0, 10000), 1900);
+        time.tm_mon = Config::wrapSub(field(0, 13), 1);
+        time.tm_mday = field(0, 31);
+        Time::CTime const day(field(0, 24), field(0, 60), field(0, 60), field(0, 1000));
+        return CDateTime(day, Time::CDate(time));
+    }
+
+    CTimeZone zone() {
+        auto const type = static_cast<CTimeZone::EType>(static_cast<int>(below(4)) - 2);
+        return CTimeZone(type, field(0, 14), field(0, 59));
+    }
+};
+
+// The absolute value, as the text of it goes.
+int unsignedOf(int number) {
+    return number < 0 ? Config::wrapSub(0, number) : number;
+}
+
+std::wstring plainISO(CDateTime const& value, CTimeZone const& zone) {
+    std::wostringstream stream;
+    stream << std::setw(4) << value.getYear() << std::setfill(L'0');
+    stream << '-' << std::setw(2) << static_cast<int>(value.getMonth());
+    stream << '-' << std::setw(2) << value.getDay();
+    stream << 'T' << std::setw(2) << value.getHour();
+    stream << ':' << std::setw(2) << value.getMinute();
+    stream << ':' << std::setw(2) << value.getSecond();
+    if (zone.type == CTimeZone::etzUTC)
+        stream << 'Z';
+    if (zone.type == CTimeZone::etzPlus || zone.type == CTimeZone::etzMinus) {
+        stream << (zone.type == CTimeZone::etzPlus ? '+' : '-');
+        stream << std::setw(2) << unsignedOf(zone.hours) << ':';
+        stream << std::setw(2) << unsignedOf(zone.minutes);
+    }
+    return stream.str();
+}
+
+std::string plainPDF(CDateTime const& value, CTimeZone const& zone) {
+    std::ostringstream stream;
+    stream << "D:" << std::setw(4) << value.getYear() << std::setfill('0');
+    for (int const number : {static_cast<int>(value.getMonth()), value.getDay(), value.getHour(),
+                             value.getMinute(), value.getSecond()})
+        stream << std::setw(2) << number;
+    if (zone.type == CTimeZone::etzUTC)
+        stream << 'Z';
+    if (zone.type == CTimeZone::etzPlus || zone.type == CTimeZone::etzMinus) {
+        stream << (zone.type == CTimeZone::etzPlus ? '+' : '-');
+        stream << std::setw(2) << unsignedOf(zone.hours) << '\'';
+        stream << std::setw(2) << unsignedOf(zone.minutes) << '\'';
+    }
+    return stream.str();
+}
+
+constexpr int valuesToWrite = 300000;
+
+TEST_F(CTimeDateTimeWritingRoadsTest, TextsAreThoseOfAPlainStream) {
+    for (int i = 0; i < valuesToWrite; ++i) {
+        CDateTime const moment = value();
+        CTimeZone const offset = zone();
+        ASSERT_EQ(moment.getAsISOdate(offset), plainISO(moment, offset)) << "seed " << seed;
+        ASSERT_EQ(moment.getAsPDFdate(offset), plainPDF(moment, offset)) << "seed " << seed;
+    }
+}
+
+TEST_F(CTimeDateTimeWritingRoadsTest, Patterns) {
+    auto const pattern = [this] {
+        std::wstring text;
+        for (std::size_t count = below(20); count > 0; --count) {
+            if (oneIn(200)) {
+                text += oneOf(std::wstring(L"xTyd\u00E9"));
+            } else if (oneIn(3)) {
+                text += oneOf(std::wstring(L".,:;-_#+*%&/()= "));
+            } else {
+                wchar_t const letter = oneOf(std::wstring(L"tcsmhDMY"));
+                text += std::wstring(letter == L'Y' ? (oneIn(2) ? 2 : 4) : 1 + below(2), letter);
+            }
+        }
+        return text;
+    };
+    compareRoads(
+        300, [&] { return std::make_pair(value(), pattern()); },
+        [](auto const& input) {
+            return TimeTest::outcomeOf([&] { return input.first.format(input.second); });
+        });
+}
+
+} // namespace
