@@ -1,7 +1,7 @@
 #include "1Base/Error/Error.h"
 #include "2System/Time/TimeClockInHand.h"
 #include "2System/Time/TimeDateTime.h"
-#include "2System/Time/TimeOutcome.h"
+#include "2System/Time/TimeReadOutcome.h"
 #include "2System/Time/TimeRoads.h"
 #include "support/ObjectCount.h"
 #include "support/TextFailures.h"
@@ -9,8 +9,6 @@
 
 #include <climits>
 #include <ctime>
-#include <iomanip>
-#include <sstream>
 #include <string>
 
 namespace {
@@ -87,23 +85,11 @@ TEST_F(CTimeDateTimeISOTest, ALocaleThatGroupsDigitsDoesSoHere) {
 
 // Reading.
 
-constexpr CDateTime::TParts untouched = 0x5555;
-
 // Value, zone and parts, or the failure with the parts untouched.
 std::string readISO(std::string const& text, bool toLocal = false, char separator = 'T') {
-    CTimeZone zone(CTimeZone::etzPlus, 7, 7);
-    CDateTime::TParts parts = untouched;
-    try {
-        CDateTime const value =
-            CDateTime::readDateTimeFromISO(text, zone, toLocal, separator, &parts);
-        std::ostringstream shown;
-        shown << show(value) << " | " << show(zone) << " | 0x" << std::hex << std::uppercase
-              << std::setw(4) << std::setfill('0') << parts;
-        return shown.str();
-    } catch (Error::CException const& exc) {
-        EXPECT_EQ(parts, untouched);
-        return show(exc);
-    }
+    TimeTest::CReadOutcome const read = TimeTest::readISO(text, toLocal, separator);
+    EXPECT_TRUE(read.value || read.parts == TimeTest::untouchedParts);
+    return show(read);
 }
 
 void expectRead(std::string const& text, std::string const& expected, char separator = 'T') {
@@ -368,7 +354,7 @@ TEST_F(CTimeDateTimeISOTest, TheOffsetIsThatOfThisMoment) {
 TEST_F(CTimeDateTimeISOTest, TheShortFormMovesAndDropsTheZone) {
     CZone const zone("XYZ-1");
     CClockInHand const clock(march);
-    CDateTime::TParts parts = untouched;
+    CDateTime::TParts parts = TimeTest::untouchedParts;
     EXPECT_EQ(show(CDateTime::readDateTimeFromISO("2021-03-05T12:30+03", 'T', &parts)),
               "2021-3-5 10:30:0.0");
     EXPECT_EQ(parts, 0x019F);

@@ -1,7 +1,7 @@
 #include "1Base/Error/Error.h"
 #include "2System/Time/TimeClockInHand.h"
 #include "2System/Time/TimeDateTime.h"
-#include "2System/Time/TimeOutcome.h"
+#include "2System/Time/TimeReadOutcome.h"
 #include "2System/Time/TimeRoads.h"
 #include "support/LogRecorder.h"
 #include "support/ObjectCount.h"
@@ -10,8 +10,6 @@
 
 #include <climits>
 #include <ctime>
-#include <iomanip>
-#include <sstream>
 #include <string>
 
 namespace {
@@ -90,22 +88,11 @@ TEST_F(CTimeDateTimePDFTest, TheZoneOfThisMomentIsWritten) {
 
 // Reading.
 
-constexpr CDateTime::TParts untouched = 0x5555;
-
 // Value, zone and parts, or the failure with the parts untouched.
 std::string readPDF(std::string const& text, bool toLocal = false) {
-    CTimeZone zone(CTimeZone::etzPlus, 7, 7);
-    CDateTime::TParts parts = untouched;
-    try {
-        CDateTime const value = CDateTime::readDateTimeFromPDF(text, zone, toLocal, &parts);
-        std::ostringstream shown;
-        shown << show(value) << " | " << show(zone) << " | 0x" << std::hex << std::uppercase
-              << std::setw(4) << std::setfill('0') << parts;
-        return shown.str();
-    } catch (Error::CException const& exc) {
-        EXPECT_EQ(parts, untouched);
-        return show(exc);
-    }
+    TimeTest::CReadOutcome const read = TimeTest::readPDF(text, toLocal);
+    EXPECT_TRUE(read.value || read.parts == TimeTest::untouchedParts);
+    return show(read);
 }
 
 void expectRead(std::string const& text, std::string const& expected) {
@@ -359,7 +346,7 @@ TEST_F(CTimeDateTimePDFTest, AnOffsetOfManyMinutesWraps) {
 TEST_F(CTimeDateTimePDFTest, TheShortFormMovesAndDropsTheZone) {
     CZone const zone("XYZ-1");
     CClockInHand const clock(march);
-    CDateTime::TParts parts = untouched;
+    CDateTime::TParts parts = TimeTest::untouchedParts;
     EXPECT_EQ(show(CDateTime::readDateTimeFromPDF("D:20210305123000+03'00'", &parts)),
               "2021-3-5 10:30:0.0");
     EXPECT_EQ(parts, 0x03BF);

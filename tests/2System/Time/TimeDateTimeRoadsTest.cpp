@@ -3,8 +3,8 @@
 
 #include "1Base/Error/Error.h"
 #include "2System/Time/TimeDateTime.h"
-#include "2System/Time/TimeOutcome.h"
-#include "2System/Time/TimeRoads.h"
+#include "2System/Time/TimeReadOutcome.h"
+#include "2System/Time/TimeStreamRoad.h"
 #include "support/ObjectCount.h"
 
 #include <cstddef>
@@ -13,13 +13,13 @@
 #include <random>
 #include <sstream>
 #include <string>
-#include <tuple>
 #include <vector>
 
 namespace {
 
 using Time::CDateTime;
 using Time::CTimeZone;
+using TimeTest::CReadOutcome;
 using TimeTest::CStreamRoad;
 
 constexpr unsigned int seed = 20210305;
@@ -61,56 +61,14 @@ void compareRoads(std::size_t rounds, TMake const& make, TOutcome const& outcome
 
 // Reading.
 
-constexpr CDateTime::TParts untouched = 0x5555;
+constexpr std::size_t dateRounds = 350;
 
-using TFields = std::tuple<int, int, int, int, int, int, int>;
-
-// Everything that a reader leaves behind.
-struct CRead {
-    TFields value;
-    std::tuple<int, int, int> zone;
-    CDateTime::TParts parts = untouched;
-    std::string failure;
-
-    bool operator==(CRead const& other) const {
-        return value == other.value && zone == other.zone && parts == other.parts &&
-               failure == other.failure;
-    }
-};
-
-std::ostream& operator<<(std::ostream& stream, CRead const& read) {
-    return stream << testing::PrintToString(read.value) << testing::PrintToString(read.zone)
-                  << read.parts << read.failure;
+CReadOutcome readISO(std::string const& text) {
+    return TimeTest::readISO(text, false);
 }
 
-TFields fieldsOf(CDateTime const& value) {
-    return {value.getYear(),   value.getMonth(),  value.getDay(),        value.getHour(),
-            value.getMinute(), value.getSecond(), value.getMilliSecond()};
-}
-
-template <class TReader>
-CRead outcomeOf(TReader const& reader) {
-    CRead read;
-    CTimeZone zone(CTimeZone::etzPlus, 7, 7);
-    try {
-        read.value = fieldsOf(reader(zone, &read.parts));
-    } catch (Error::CException const& exc) {
-        read.failure = TimeTest::show(exc);
-    }
-    read.zone = {zone.type, zone.hours, zone.minutes};
-    return read;
-}
-
-CRead readISO(std::string const& text) {
-    return outcomeOf([&](CTimeZone& zone, CDateTime::TParts* parts) {
-        return CDateTime::readDateTimeFromISO(text, zone, false, 'T', parts);
-    });
-}
-
-CRead readPDF(std::string const& text) {
-    return outcomeOf([&](CTimeZone& zone, CDateTime::TParts* parts) {
-        return CDateTime::readDateTimeFromPDF(text, zone, false, parts);
-    });
+CReadOutcome readPDF(std::string const& text) {
+    return TimeTest::readPDF(text, false);
 }
 
 class CTimeDateTimeReadingRoadsTest : public CTimeDateTimeRoadsTest {
@@ -197,25 +155,25 @@ class CTimeDateTimeReadingRoadsTest : public CTimeDateTimeRoadsTest {
 TEST_F(CTimeDateTimeReadingRoadsTest, ISODates) {
     std::size_t dates = 0;
     compareRoads(
-        500, [this] { return isoText(); },
+        dateRounds, [this] { return isoText(); },
         [&dates](std::string const& text) {
-            CRead const read = readISO(text);
-            dates += read.failure.empty();
+            CReadOutcome read = readISO(text);
+            dates += read.value.has_value();
             return read;
         });
-    EXPECT_GT(dates, 2 * 100000U) << "too few of the texts were dates";
+    EXPECT_GT(dates, dateRounds * 200U) << "too few of the texts were dates";
 }
 
 TEST_F(CTimeDateTimeReadingRoadsTest, PDFDates) {
     std::size_t dates = 0;
     compareRoads(
-        500, [this] { return pdfText(); },
+        dateRounds, [this] { return pdfText(); },
         [&dates](std::string const& text) {
-            CRead const read = readPDF(text);
-            dates += read.failure.empty();
+            CReadOutcome read = readPDF(text);
+            dates += read.value.has_value();
             return read;
         });
-    EXPECT_GT(dates, 2 * 100000U) << "too few of the texts were dates";
+    EXPECT_GT(dates, dateRounds * 200U) << "too few of the texts were dates";
 }
 
 TEST_F(CTimeDateTimeReadingRoadsTest, ShortTextsOfTheCharactersThatCount) {

@@ -1,23 +1,15 @@
-/// Sends dates by the two roads that they may take: by hand, or by a stream.
+/// Runs a check by the two roads that dates may take: by hand, and by a stream.
+///
+///     TimeTest::onBothRoads([&] { EXPECT_EQ(value.getAsPDFdate(zone), text); });
 #ifndef QORN_TESTS_TIMEROADS_H
 #define QORN_TESTS_TIMEROADS_H
 
-#include "1Base/StdUtil/StdUtilLocales.h"
+#include "2System/Time/TimeStreamRoad.h"
 
 #include <gtest/gtest.h>
 
-#include <locale>
-
 namespace TimeTest {
 
-/// While it lives, the global locale has a facet of its own that does what the classic one does:
-/// the stream's texts are the same, but nothing goes by hand.
-class CStreamRoad {
-  private:
-    StdUtilTest::CGlobalLocale const global_{new std::numpunct<char>};
-};
-
-/// Runs `check` on both roads.
 template <class TCheck>
 void onBothRoads(TCheck const& check) {
     {
