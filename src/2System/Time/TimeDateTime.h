@@ -75,7 +75,8 @@ class CDateTime : public CDate, public CTime {
     /// at least). Raises TExcTimeFormatError for anything else.
     Strings::string format(Strings::string const& pattern) const;
 
-    /// Writes the specifier at `pos`, which moves on to the last character that it took.
+    /// Writes the specifier at `pos`, which moves on to the last character that it took. The number
+    /// is written even where a third letter behind it then makes the specifier none.
     void putFormat(Strings::string const& pattern, Strings::string::size_type& pos,
                    Streams::u_ostream& out) const;
 
@@ -91,6 +92,7 @@ class CDateTime : public CDate, public CTime {
     /// zone in the text `zone` stays at etzNone and the value is as written; with one, `toLocal`
     /// moves it by the difference to the local offset of this moment. `parts`, which may be null,
     /// is stored at success only. Raises TExcTimeDateTime; `zone` then holds what was read so far.
+    /// The failure quotes the text: one that is no UTF-8 raises TExcEncoding in its place.
     static CDateTime readDateTimeFromPDF(std::string const& text, TParts* parts);
     static CDateTime readDateTimeFromPDF(std::string const& text, CTimeZone& zone, bool toLocal,
                                          TParts* parts);
