@@ -1,7 +1,7 @@
 /// A clock that tests set.
 ///
-///     TimeTest::CClockInHand const clock(1614945909);   // 5 March 2021, 12:05:09 UTC
-///     Time::CDateTime::getCurrentTimeUTC();
+///     TimeTest::CClockInHand const clock(TimeTest::march);
+///     Time::CDateTime::getCurrentTimeUTC();   // 5 March 2021, 12:05:09
 #ifndef QORN_TESTS_TIMECLOCKINHAND_H
 #define QORN_TESTS_TIMECLOCKINHAND_H
 
@@ -10,6 +10,9 @@
 #include <ctime>
 
 namespace TimeTest {
+
+inline constexpr std::time_t march = 1614945909; ///< 5 March 2021, 12:05:09 UTC
+inline constexpr std::time_t july = 1625140800;  ///< 1 July 2021, 12:00:00 UTC
 
 /// Stands still at one moment while it lives.
 class CClockInHand {

@@ -18,12 +18,11 @@ using TestSupport::failedCheckOf;
 using Time::CDateTime;
 using Time::CTimeZone;
 using TimeTest::CClockInHand;
+using TimeTest::july;
+using TimeTest::march;
 using TimeTest::show;
 
 using CTimeDateTimeClockTest = TestSupport::CObjectCountTest;
-
-constexpr std::time_t march = 1614945909; // 5 March 2021, 12:05:09 UTC
-constexpr std::time_t july = 1625140800;  // 1 July 2021, 12:00:00 UTC
 
 // The local value and the zone.
 std::string localAt(std::time_t moment, std::string const& zoneName) {

@@ -17,14 +17,15 @@ using TestSupport::CZone;
 using Time::CDate;
 using Time::CDateTime;
 using Time::CTimeZone;
+using TimeTest::badDate;
+using TimeTest::badMonth;
 using TimeTest::CClockInHand;
+using TimeTest::march;
 using TimeTest::onBothRoads;
 using TimeTest::show;
 using namespace std::string_literals;
 
 using CTimeDateTimeISOTest = TestSupport::CObjectCountTest;
-
-constexpr std::time_t march = 1614945909; // 5 March 2021, 12:05:09 UTC
 
 CDateTime const sample(5, CDate::emMar, 2021, 8, 5, 9, 123);
 
@@ -229,14 +230,6 @@ TEST_F(CTimeDateTimeISOTest, AnEmptyTextIsMissing) {
     expectRead("", "TimeDateTime: Argument @(type) is missing|type=ISO date|s=");
 }
 
-std::string badMonth(std::string const& month) {
-    return "TimeDateTime: " + TimeTest::wrongArgument("month", month, "Invalid month");
-}
-
-std::string badDate(std::string const& date) {
-    return "TimeDateTime: " + TimeTest::wrongArgument("Date", date, "Invalid date");
-}
-
 TEST_F(CTimeDateTimeISOTest, MonthAndDateAreTested) {
     expectRead("2021-13-05", badMonth("13"));
     expectRead("2021-00-05", badMonth("0"));
@@ -303,8 +296,7 @@ TEST_F(CTimeDateTimeISOTest, TextsBeyondASCIIComeBackInTheFailure) {
 // Into the local zone.
 
 std::string movedISO(std::string const& text) {
-    std::string const result = readISO(text, true);
-    return result.substr(0, result.find(" |"));
+    return TimeTest::valueIn(readISO(text, true));
 }
 
 TEST_F(CTimeDateTimeISOTest, ATextWithoutAZoneIsMovedAsOneOfUTC) {
@@ -347,7 +339,7 @@ TEST_F(CTimeDateTimeISOTest, TheOffsetIsThatOfThisMoment) {
         CClockInHand const clock(march);
         EXPECT_EQ(movedISO("2021-07-05T12:30Z"), "2021-7-5 12:30:0.0");
     }
-    CClockInHand const clock(1625140800); // July
+    CClockInHand const clock(TimeTest::july);
     EXPECT_EQ(movedISO("2021-01-05T12:30Z"), "2021-1-5 13:30:0.0");
 }
 

@@ -18,14 +18,15 @@ using TestSupport::CZone;
 using Time::CDate;
 using Time::CDateTime;
 using Time::CTimeZone;
+using TimeTest::badDate;
+using TimeTest::badMonth;
 using TimeTest::CClockInHand;
+using TimeTest::march;
 using TimeTest::onBothRoads;
 using TimeTest::show;
 using namespace std::string_literals;
 
 using CTimeDateTimePDFTest = TestSupport::CObjectCountTest;
-
-constexpr std::time_t march = 1614945909; // 5 March 2021, 12:05:09 UTC
 
 CDateTime const sample(5, CDate::emMar, 2021, 8, 5, 9, 123);
 
@@ -160,9 +161,7 @@ TEST_F(CTimeDateTimePDFTest, ANonDigitPassesAllObjectsBehind) {
 
 TEST_F(CTimeDateTimePDFTest, AYearIsAsLongAsItsNumber) {
     expectRead("D:2021", "2021-1-1 0:0:0.0" + none + "0x0001");
-    auto const badYear = [](std::string const& year) {
-        return "TimeDateTime: " + TimeTest::wrongArgument("Date", year + "/1/1", "Invalid date");
-    };
+    auto const badYear = [](std::string const& year) { return badDate(year + "/1/1"); };
     expectRead("D:202", badYear("202"));
     expectRead("D:  21", badYear("21"));
     expectRead("D:+021", badYear("21"));
@@ -245,12 +244,6 @@ TEST_F(CTimeDateTimePDFTest, AnEmptyTextIsMissing) {
 }
 
 TEST_F(CTimeDateTimePDFTest, MonthAndDateAreTestedBeforeTheZone) {
-    auto const badMonth = [](std::string const& month) {
-        return "TimeDateTime: " + TimeTest::wrongArgument("month", month, "Invalid month");
-    };
-    auto const badDate = [](std::string const& date) {
-        return "TimeDateTime: " + TimeTest::wrongArgument("Date", date, "Invalid date");
-    };
     expectRead("D:20211305", badMonth("13"));
     expectRead("D:202100", badMonth("0"));
     expectRead("D:20219999996199X", badMonth("99"));
@@ -293,8 +286,7 @@ TEST_F(CTimeDateTimePDFTest, ABadDateIsLogged) {
 // Into the local zone.
 
 std::string movedPDF(std::string const& text) {
-    std::string const result = readPDF(text, true);
-    return result.substr(0, result.find(" |"));
+    return TimeTest::valueIn(readPDF(text, true));
 }
 
 TEST_F(CTimeDateTimePDFTest, ATextWithoutAZoneIsNotMoved) {

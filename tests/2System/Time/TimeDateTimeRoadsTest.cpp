@@ -152,28 +152,24 @@ class CTimeDateTimeReadingRoadsTest : public CTimeDateTimeRoadsTest {
     std::string const signs = "+-";
 };
 
-TEST_F(CTimeDateTimeReadingRoadsTest, ISODates) {
+// Texts of which a good part are dates.
+template <class TMake, class TRead>
+void compareDates(TMake const& make, TRead const& read) {
     std::size_t dates = 0;
-    compareRoads(
-        dateRounds, [this] { return isoText(); },
-        [&dates](std::string const& text) {
-            CReadOutcome read = readISO(text);
-            dates += read.value.has_value();
-            return read;
-        });
+    compareRoads(dateRounds, make, [&](std::string const& text) {
+        CReadOutcome outcome = read(text);
+        dates += outcome.value.has_value();
+        return outcome;
+    });
     EXPECT_GT(dates, dateRounds * 200U) << "too few of the texts were dates";
 }
 
+TEST_F(CTimeDateTimeReadingRoadsTest, ISODates) {
+    compareDates([this] { return isoText(); }, readISO);
+}
+
 TEST_F(CTimeDateTimeReadingRoadsTest, PDFDates) {
-    std::size_t dates = 0;
-    compareRoads(
-        dateRounds, [this] { return pdfText(); },
-        [&dates](std::string const& text) {
-            CReadOutcome read = readPDF(text);
-            dates += read.value.has_value();
-            return read;
-        });
-    EXPECT_GT(dates, dateRounds * 200U) << "too few of the texts were dates";
+    compareDates([this] { return pdfText(); }, readPDF);
 }
 
 TEST_F(CTimeDateTimeReadingRoadsTest, ShortTextsOfTheCharactersThatCount) {

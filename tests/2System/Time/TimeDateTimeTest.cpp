@@ -42,8 +42,7 @@ std::tm brokenDown(int year, int month, int day, int hour, int minute, int secon
     return time;
 }
 
-std::string const invalidDate =
-    "TimeDateTime: " + TimeTest::wrongArgument("Date", "2021/13/5", "Invalid date");
+std::string const invalidDate = TimeTest::badDate("2021/13/5");
 
 // Values.
 

@@ -65,6 +65,15 @@ inline std::string wrongArgument(std::string const& type, std::string const& key
            "|reason=" + reason;
 }
 
+/// The failures of a month and of a date ("2021/2/30") that are none.
+inline std::string badMonth(std::string const& month) {
+    return "TimeDateTime: " + wrongArgument("month", month, "Invalid month");
+}
+
+inline std::string badDate(std::string const& date) {
+    return "TimeDateTime: " + wrongArgument("Date", date, "Invalid date");
+}
+
 } // namespace TimeTest
 
 #endif

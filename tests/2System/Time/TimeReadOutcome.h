@@ -77,6 +77,11 @@ inline std::string show(CReadOutcome const& read) {
     return shown.str();
 }
 
+/// The value's part of such a text.
+inline std::string valueIn(std::string const& shown) {
+    return shown.substr(0, shown.find(" |"));
+}
+
 inline std::ostream& operator<<(std::ostream& stream, CReadOutcome const& read) {
     return stream << show(read) << " (" << show(read.zone) << ", " << read.parts << ")";
 }
