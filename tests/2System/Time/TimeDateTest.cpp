@@ -6,6 +6,7 @@
 
 #include "2System/Time/TimeDateFields.h"
 #include "2System/Time/TimeFailure.h"
+#include "2System/Time/TimeWritten.h"
 #include "support/LogRecorder.h"
 #include "support/Registry.h"
 #include "support/TextFailures.h"
@@ -24,6 +25,7 @@ using TestSupport::CLogRecord;
 using TestSupport::failedCheckOf;
 using TestSupport::TParameters;
 using Time::CDate;
+using TimeTest::expectText;
 using TimeTest::fieldsOf;
 using TimeTest::monthOf;
 using TimeTest::TFields;
@@ -32,13 +34,6 @@ using TimeTest::uncheckedDate;
 using TimeTest::wrongArgument;
 
 using CTimeDateTest = TestSupport::CErrorTest;
-
-template <class TCh>
-std::basic_string<TCh> textOf(CDate const& date) {
-    std::basic_ostringstream<TCh> stream;
-    stream << date;
-    return stream.str();
-}
 
 TEST_F(CTimeDateTest, ADateKeepsItsFields) {
     CDate const date(5, CDate::emMar, 2021);
@@ -191,11 +186,6 @@ TEST_F(CTimeDateTest, DatesCompareByYearThenMonthThenDay) {
         }
 }
 
-template <class TCh>
-void expectText(CDate const& date, std::string const& ascii) {
-    EXPECT_EQ(textOf<TCh>(date), std::basic_string<TCh>(ascii.begin(), ascii.end()));
-}
-
 TEST_F(CTimeDateTest, ADateIsWrittenWithDots) {
     std::vector<std::pair<CDate, std::string>> const texts = {
         {CDate(5, CDate::emMar, 2021), "05.03.2021"},
@@ -205,10 +195,8 @@ TEST_F(CTimeDateTest, ADateIsWrittenWithDots) {
         {uncheckedDate(100, 65537, 7), "100.65537.7"},
         {uncheckedDate(-1, -12, -5), "-1.-12.-5"},
         {uncheckedDate(-1, 3, 0), "-1.03.0"}};
-    for (auto const& [date, text] : texts) {
-        expectText<char>(date, text);
-        expectText<wchar_t>(date, text);
-    }
+    for (auto const& [date, text] : texts)
+        expectText(date, text);
 }
 
 template <class TCh>
@@ -230,9 +218,8 @@ TEST_F(CTimeDateTest, FillAndAdjustmentStayOnTheStream) {
 }
 
 TEST_F(CTimeDateTest, OtherFlagsOfTheStreamArePartOfTheText) {
-    std::ostringstream stream;
-    stream << std::showpos << CDate(5, CDate::emMar, 2021);
-    EXPECT_EQ(stream.str(), "+5.+3.+2021");
+    expectText(CDate(5, CDate::emMar, 2021), "+5.+3.+2021",
+               [](auto& stream) { stream << std::showpos; });
 }
 
 TEST_F(CTimeDateTest, AnOutputGivesTheStreamBack) {

@@ -6,6 +6,7 @@
 #include "2System/Time/TimeDateFields.h"
 #include "2System/Time/TimeFailure.h"
 #include "2System/Time/TimeLocales.h"
+#include "2System/Time/TimeWritten.h"
 #include "support/LogRecorder.h"
 #include "support/Registry.h"
 
@@ -21,6 +22,7 @@ using Time::CDate;
 using Time::CTime;
 using TimeTest::badStream;
 using TimeTest::CGroupingLocale;
+using TimeTest::expectText;
 using TimeTest::fieldsOf;
 using TimeTest::TFields;
 using TimeTest::timeFailureOf;
@@ -28,20 +30,6 @@ using TimeTest::uncheckedDate;
 using TimeTest::wrongArgument;
 
 using CTimeLocaleTest = TestSupport::CErrorTest;
-
-template <class TCh, class TValue>
-std::string textOf(TValue const& value) {
-    std::basic_ostringstream<TCh> stream;
-    stream << value;
-    std::basic_string<TCh> const text = stream.str();
-    return std::string(text.begin(), text.end());
-}
-
-template <class TValue>
-void expectText(TValue const& value, std::string const& text) {
-    EXPECT_EQ(textOf<char>(value), text);
-    EXPECT_EQ(textOf<wchar_t>(value), text);
-}
 
 TEST_F(CTimeLocaleTest, WrittenNumbersAreGrouped) {
     CGroupingLocale const locale(',', "\3");

@@ -51,6 +51,14 @@ auto readingOf(std::string const& text, TRead const& read) {
     return reading;
 }
 
+/// The same from streams of both widths, which must not differ.
+template <class TRead>
+auto readingOfBoth(std::string const& text, TRead const& read) {
+    auto const narrow = readingOf<char>(text, read);
+    EXPECT_EQ(narrow, readingOf<wchar_t>(text, read)) << text;
+    return narrow;
+}
+
 } // namespace TimeTest
 
 #endif

@@ -3,6 +3,7 @@
 #include "2System/Time/TimeTime.h"
 #include "2System/Time/TimeDateTime.h"
 
+#include "2System/Time/TimeWritten.h"
 #include "support/Registry.h"
 
 #include <gtest/gtest.h>
@@ -23,6 +24,7 @@ namespace {
 using Strings::string;
 using Time::CTime;
 using Time::CTimeZone;
+using TimeTest::expectText;
 
 using CTimeTimeTest = TestSupport::CErrorTest;
 using CTimeTimeZoneTest = TestSupport::CErrorTest;
@@ -199,22 +201,13 @@ TEST_F(CTimeTimeTest, DifferencesAreSecondsAndWrap) {
     EXPECT_EQ(CTime(INT_MAX, 0, 0, 0) - CTime(0, 0, 0, 0), -3600);
 }
 
-template <class TCh>
-void expectText(CTime const& time, std::string const& ascii) {
-    std::basic_ostringstream<TCh> stream;
-    stream << time;
-    EXPECT_EQ(stream.str(), std::basic_string<TCh>(ascii.begin(), ascii.end()));
-}
-
 TEST_F(CTimeTimeTest, ATimeIsWrittenWithColons) {
     std::pair<CTime, std::string> const texts[] = {{CTime(8, 5, 9, 123), "08:05:09"},
                                                    {CTime(23, 59, 59, 999), "23:59:59"},
                                                    {CTime(100, 60, 60, 0), "100:60:60"},
                                                    {CTime(-1, -10, 0, 0), "-1:-10:00"}};
-    for (auto const& [time, text] : texts) {
-        expectText<char>(time, text);
-        expectText<wchar_t>(time, text);
-    }
+    for (auto const& [time, text] : texts)
+        expectText(time, text);
 }
 
 template <class TCh>
@@ -235,9 +228,7 @@ TEST_F(CTimeTimeTest, FillStaysAndAdjustmentIsTheStreams) {
 }
 
 TEST_F(CTimeTimeTest, InternalAdjustmentFillsBehindASign) {
-    std::ostringstream stream;
-    stream << std::internal << CTime(-1, 5, -9, 0);
-    EXPECT_EQ(stream.str(), "-1:05:-9");
+    expectText(CTime(-1, 5, -9, 0), "-1:05:-9", [](auto& stream) { stream << std::internal; });
 }
 
 // Against a count of milliseconds, for times whose fields are in order.
