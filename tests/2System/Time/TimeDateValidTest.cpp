@@ -73,14 +73,9 @@ TEST_F(CTimeDateValidTest, OnlyLow16BitsAreTested) {
 TEST_F(CTimeDateValidTest, EveryDayOfEveryYearIsTestedAsTheRuleSays) {
     for (int year = 1395; year <= 10005; ++year)
         for (int month = 0; month <= 13; ++month)
-            for (int const day : {-1, 0, 1, 28, 29, 30, 31, 32}) {
-                bool const expected = naiveIsValid(day, month, year);
-                // An exception for each end of a month would take seconds: some years will do.
-                if (!expected && year % 97 != 0 && day >= 29 && day <= 31)
-                    continue;
-                ASSERT_EQ(CDate::isValid(day, monthOf(month), year), expected)
+            for (int const day : {-1, 0, 1, 28, 29, 30, 31, 32})
+                ASSERT_EQ(CDate::isValid(day, monthOf(month), year), naiveIsValid(day, month, year))
                     << day << '.' << month << '.' << year;
-            }
 }
 
 TEST_F(CTimeDateValidTest, AnyFieldsAreTestedAsTheRuleSays) {

@@ -47,6 +47,11 @@ CCycle cycleOf(CDate::TYear year) {
     return year < firstGregorianYear ? CCycle{1, 365} : CCycle{400, 146097};
 }
 
+// The cycles that both so many years and so many days have room for.
+Int32 cyclesWithin(std::int64_t years, std::int64_t days, CCycle const& cycle) {
+    return static_cast<Int32>(std::min(years / cycle.years, days / cycle.days));
+}
+
 Int32 daysInYear(CDate::TYear year) {
     return isLeapYear(year) ? 366 : 365;
 }
@@ -57,8 +62,7 @@ void takeYears(Int32& days, CDate::TYear& years) {
     while (days > daysInYear(years)) {
         CCycle const cycle = cycleOf(years);
         std::int64_t const end = years < firstGregorianYear ? firstGregorianYear : lastYear;
-        auto const cycles = static_cast<Int32>(
-            std::min<std::int64_t>((end - years) / cycle.years, (days - 1) / cycle.days));
+        Int32 const cycles = days > cycle.days ? cyclesWithin(end - years, days - 1, cycle) : 0;
         if (cycles > 0) {
             days -= cycles * cycle.days;
             years += cycles * cycle.years;
@@ -75,8 +79,8 @@ void giveYears(Int32& days, CDate::TYear& years) {
          before = wrapSub(years, 1)) {
         CCycle const cycle = cycleOf(before);
         std::int64_t const begin = before < firstGregorianYear ? firstYear : firstGregorianYear;
-        auto const cycles = static_cast<Int32>(
-            std::min<std::int64_t>((years - begin) / cycle.years, days / -cycle.days));
+        Int32 const cycles =
+            days <= -cycle.days ? cyclesWithin(years - begin, -std::int64_t(days), cycle) : 0;
         if (cycles > 0) {
             days += cycles * cycle.days;
             years -= cycles * cycle.years;
@@ -87,6 +91,16 @@ void giveYears(Int32& days, CDate::TYear& years) {
     }
 }
 
+// The days of the months before `month`. There is no thirteenth month: what is behind it fails.
+Int32 daysBefore(CDate::EMonth month, CDate::TYear year) {
+    constexpr Int32 sums[] = {0, 31, 59, 90, 120, 151, 181, 212, 243, 273, 304, 334, 365};
+    Int32 m = std::clamp<Int32>(month, 1, 13);
+    Int32 days = sums[m - 1] + (m > CDate::emFeb && isLeapYear(year) ? 1 : 0);
+    for (; m < month; ++m)
+        days += maxDaysInMonth(m, year);
+    return days;
+}
+
 // The scale of differences: a leap day every four years whatever the century, although the months
 // of the year itself know better.
 Int32 pastDays(CDate::TDay day, CDate::EMonth month, CDate::TYear year) {
@@ -94,9 +108,7 @@ Int32 pastDays(CDate::TDay day, CDate::EMonth month, CDate::TYear year) {
     Int32 days = wrapAdd(years / 4, Config::wrapMul(years, 365));
     if (isLeapYear(year))
         days = wrapSub(days, 1);
-    for (Int32 m = 1; m < month; ++m)
-        days = wrapAdd(days, maxDaysInMonth(m, year));
-    return wrapAdd(days, day);
+    return wrapAdd(wrapAdd(days, daysBefore(month, year)), day);
 }
 
 Int32 pastDays(CDate const& date) {

@@ -10,20 +10,26 @@
 namespace Time {
 namespace {
 
+using boost::gregorian::greg_month;
+using boost::gregorian::greg_year;
+using boost::gregorian::gregorian_calendar;
+
 constexpr unsigned short firstYear = 1400;
 constexpr unsigned short lastYear = 10000;
 
-// What the calendar would refuse before it looks at the month's end, at the cost of an exception.
-constexpr bool isWithinRanges(unsigned short day, unsigned short month, unsigned short year) {
-    return day >= 1 && day <= 31 && Detail::checkMonth(month) && year >= firstYear &&
-           year <= lastYear;
+// The calendar ends a year too early; 2000 has the months of 10000.
+greg_year likeYear(unsigned short year) {
+    return greg_year(year == lastYear ? 2000 : year);
 }
 
-// The calendar ends a year too early; 2000 has the months of 10000.
+// What the calendar would refuse by an exception, which costs a hundred times the test.
+bool isOutside(unsigned short day, unsigned short month, unsigned short year) {
+    return year < firstYear || year > lastYear || !Detail::checkMonth(month) || day < 1 ||
+           day > gregorian_calendar::end_of_month_day(likeYear(year), greg_month(month));
+}
+
 void makeGregorianDate(unsigned short year, unsigned short month, unsigned short day) {
-    unsigned short const likeYear = year == lastYear ? 2000 : year;
-    boost::gregorian::date(boost::gregorian::greg_year(likeYear),
-                           boost::gregorian::greg_month(month), boost::gregorian::greg_day(day));
+    boost::gregorian::date(likeYear(year), greg_month(month), boost::gregorian::greg_day(day));
 }
 
 } // namespace
@@ -40,7 +46,7 @@ bool Detail::isKeptByMktime(CDate::TDay day, CDate::EMonth month, CDate::TYear y
 }
 
 bool CDate::isValid(TDay day, EMonth month, TYear year) {
-    return isWithinRanges(Detail::low16(day), Detail::low16(month), Detail::low16(year)) &&
+    return !isOutside(Detail::low16(day), Detail::low16(month), Detail::low16(year)) &&
            Detail::isMadeBy(makeGregorianDate, day, month, year);
 }
 
