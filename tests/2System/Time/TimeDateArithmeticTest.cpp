@@ -186,6 +186,7 @@ TEST_F(CTimeDateArithmeticTest, OneDayOnFromAMonthOutsideTheTableFailsAnAssertio
         CDate date = at(5, std::stoi(month), 2021);
         EXPECT_EQ(failedCheckOf([&] { date.inc_(); }), "false") << month;
         EXPECT_EQ(failedCheckOf([&] { date.inc_(); }, "month"), month);
+        EXPECT_EQ(date.getDay(), 7) << "the day goes on before the month is looked at";
     }
 }
 
