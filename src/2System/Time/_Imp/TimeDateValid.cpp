@@ -22,7 +22,7 @@ greg_year likeYear(unsigned short year) {
     return greg_year(year == lastYear ? 2000 : year);
 }
 
-// What the calendar would refuse by an exception, which costs a hundred times the test.
+// What the calendar would refuse by an exception, which costs hundreds of times the test.
 bool isOutside(unsigned short day, unsigned short month, unsigned short year) {
     return year < firstYear || year > lastYear || !Detail::checkMonth(month) || day < 1 ||
            day > gregorian_calendar::end_of_month_day(likeYear(year), greg_month(month));
