@@ -36,6 +36,18 @@ Strings::string getUserName(bool login) {
     return fromNative(Native::getUserName(login));
 }
 
+Strings::string getMachineName() {
+    return fromNative(Native::getMachineName());
+}
+
+Strings::string getModelIdentifier() {
+    return fromNative(Native::getModelIdentifier());
+}
+
+Strings::string getUserEmailAddress() {
+    return fromNative(Native::getUserEmailAddress());
+}
+
 bool setHiddenAttribute(Strings::string const& path, bool hidden) {
     return Native::setHiddenAttribute(toNative(path), hidden);
 }

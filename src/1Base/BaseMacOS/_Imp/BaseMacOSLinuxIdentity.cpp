@@ -15,9 +15,6 @@ namespace MacOS {
 namespace Native {
 namespace {
 
-// About a tenth of a second where the disk's cache has them.
-constexpr std::size_t entryLimit = 50000;
-
 struct CFileStatus {
     CFileIdentity identity;
     bool isFolder;
@@ -51,9 +48,10 @@ bool isSameFile(CFileIdentity const& left, CFileIdentity const& right) {
 
 class CFileSearch {
   public:
-    explicit CFileSearch(CFileIdentity const& wanted) : wanted_(wanted) {}
+    CFileSearch(CFileIdentity const& wanted, std::size_t entryLimit)
+        : wanted_(wanted), left_(entryLimit) {}
 
-    // Level by level through `top`, but not into `skipped`.
+    // Level by level through `top`, but not into `skipped`. True where nothing is left to do.
     bool searchTree(std::string const& top, std::uint64_t device, std::string const& skipped) {
         std::deque<std::string> folders(1, top);
         while (!folders.empty() && found_.empty() && left_ > 0) {
@@ -71,32 +69,42 @@ class CFileSearch {
     void searchFolder(std::string const& path, std::uint64_t device, std::string const& skipped,
                       std::deque<std::string>& folders) {
         std::unique_ptr<DIR, int (*)(DIR*)> const folder(::opendir(path.c_str()), ::closedir);
-        if (!folder)
-            return;
-        while (dirent const* const entry = ::readdir(folder.get())) {
+        dirent const* entry = nullptr;
+        while (folder && found_.empty() && (entry = ::readdir(folder.get())) != nullptr) {
             if (std::strcmp(entry->d_name, ".") == 0 || std::strcmp(entry->d_name, "..") == 0)
                 continue;
             if (left_ == 0)
                 return;
             --left_;
+            std::string entryPath = joinPath(path, entry->d_name);
             std::optional<CFileStatus> const status =
                 statusOf(::dirfd(folder.get()), entry->d_name);
             if (!status)
                 continue;
-            std::string entryPath = joinPath(path, entry->d_name);
-            if (isSameFile(wanted_, status->identity)) {
+            if (isSameFile(wanted_, status->identity))
                 found_ = entryPath;
-                return;
-            }
-            if (status->isFolder && status->identity.device == device && entryPath != skipped)
+            else if (status->isFolder && status->identity.device == device && entryPath != skipped)
                 folders.push_back(std::move(entryPath));
         }
     }
 
     CFileIdentity wanted_;
-    std::size_t left_ = entryLimit;
+    std::size_t left_;
     std::string found_;
 };
+
+// Where the path's folder is gone, the one above it, and so on.
+std::string nearestFolder(std::string const& path) {
+    std::string folder = folderOf(path);
+    while (realPath(folder).empty() && folder != "/")
+        folder = folderOf(folder);
+    return realPath(folder);
+}
+
+bool isOnDevice(std::string const& path, std::uint64_t device) {
+    std::optional<CFileIdentity> const identity = identityOf(path);
+    return identity && identity->device == device;
+}
 
 } // namespace
 
@@ -107,21 +115,16 @@ std::optional<CFileIdentity> identityOf(std::string const& path) {
     return status->identity;
 }
 
-std::string findMovedFile(CFileIdentity const& wanted, std::string const& path) {
-    CFileSearch search(wanted);
-    std::optional<std::uint64_t> device;
+std::string findMovedFile(CFileIdentity const& wanted, std::string const& path,
+                          std::size_t entryLimit) {
+    CFileSearch search(wanted, entryLimit);
+    std::string folder = nearestFolder(path);
+    std::optional<CFileIdentity> const start = identityOf(folder);
     std::string searched;
-    for (std::string folder = folderOf(path);; folder = folderOf(folder)) {
-        if (std::optional<CFileIdentity> const identity = identityOf(folder)) {
-            if (device && *device != identity->device)
-                break;
-            device = identity->device;
-            if (search.searchTree(folder, *device, searched))
-                break;
-            searched = folder;
-        }
-        if (folder == "/")
-            break;
+    while (start && isOnDevice(folder, start->device) &&
+           !search.searchTree(folder, start->device, searched) && folder != "/") {
+        searched = folder;
+        folder = folderOf(folder);
     }
     return search.found();
 }

@@ -73,5 +73,12 @@ std::optional<std::string> unquoted(std::string_view text) {
     return std::string(text);
 }
 
+std::string assignedValue(std::string_view file, std::string_view key) {
+    std::string last;
+    for (std::string const& text : assignedTexts(file, key))
+        last = unquoted(text).value_or(last);
+    return last;
+}
+
 } // namespace Native
 } // namespace MacOS

@@ -22,6 +22,9 @@ std::vector<std::string> assignedTexts(std::string_view file, std::string_view k
 /// than a comment follows the closing one. No variable is expanded.
 std::optional<std::string> unquoted(std::string_view text);
 
+/// The value of the last line that assigns one to `key`; empty without any.
+std::string assignedValue(std::string_view file, std::string_view key);
+
 } // namespace Native
 } // namespace MacOS
 
