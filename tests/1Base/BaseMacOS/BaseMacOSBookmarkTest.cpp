@@ -1,11 +1,10 @@
 #include "1Base/BaseMacOS/BaseMacOS.h"
 
-#include "BaseMacOSSystemCalls.h"
-#include "support/FileRoot.h"
-#include "support/TextFailures.h"
-
+#include "1Base/BaseMacOS/BaseMacOSSystemCalls.h"
 #include "1Base/BaseMacOS/_Imp/BaseMacOSLinuxIdentity.h"
 #include "1Base/Encoding/EncodingConverter.h"
+#include "support/FileRoot.h"
+#include "support/TextFailures.h"
 
 #include <sys/stat.h>
 #include <unistd.h>
@@ -378,6 +377,7 @@ TEST_F(CBaseMacOSBookmarkTest, AMissingSourceLeavesAnOldBookmarkAlone) {
 
 TEST_F(CBaseMacOSBookmarkTest, ABookmarkThatCannotBeWrittenIsLogged) {
     makeFolders(path("folder"));
+    ASSERT_EQ(chdir(path().c_str()), 0);
     struct CRow {
         std::string bookmark;
         std::string line;
@@ -392,6 +392,7 @@ TEST_F(CBaseMacOSBookmarkTest, ABookmarkThatCannotBeWrittenIsLogged) {
         EXPECT_FALSE(create(path("file"), row.bookmark)) << row.bookmark;
         EXPECT_EQ(system.logged, TNames{row.line});
     }
+    ASSERT_EQ(chdir("/"), 0);
     EXPECT_EQ(listTree(path()), (TNames{"file", "folder", "mark"}));
 }
 

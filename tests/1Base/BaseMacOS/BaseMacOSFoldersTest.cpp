@@ -1,10 +1,9 @@
 #include "1Base/BaseMacOS/BaseMacOS.h"
 
-#include "BaseMacOSSystemCalls.h"
+#include "1Base/BaseMacOS/BaseMacOSSystemCalls.h"
+#include "1Base/Encoding/EncodingConverter.h"
 #include "support/FileRoot.h"
 #include "support/TextFailures.h"
-
-#include "1Base/Encoding/EncodingConverter.h"
 
 #include <string>
 #include <vector>

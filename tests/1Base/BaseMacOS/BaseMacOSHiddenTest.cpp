@@ -1,9 +1,8 @@
 #include "1Base/BaseMacOS/BaseMacOS.h"
 
-#include "BaseMacOSSystemCalls.h"
-#include "support/FileRoot.h"
-
+#include "1Base/BaseMacOS/BaseMacOSSystemCalls.h"
 #include "1Base/Encoding/EncodingConverter.h"
+#include "support/FileRoot.h"
 
 #include <sys/stat.h>
 #include <sys/xattr.h>

@@ -1,6 +1,6 @@
 #include "1Base/BaseMacOS/_Imp/BaseMacOSLinuxIdentity.h"
 
-#include "BaseMacOSSystemCalls.h"
+#include "1Base/BaseMacOS/BaseMacOSSystemCalls.h"
 #include "support/FileRoot.h"
 
 #include <sys/stat.h>
@@ -56,13 +56,13 @@ TEST_F(CBaseMacOSIdentityTest, UpperLevelsComeFirst) {
 
 TEST_F(CBaseMacOSIdentityTest, TheSearchEndsAtItsLimit) {
     TestSupport::makeFolders(path("a/b"));
-    TestSupport::makeFolders(path("c"));
-    CFileIdentity const wanted = made("c/target");
-    // "b"; then "a" and "c", in the order of the disk; then the target. What lies in "a" was seen.
-    EXPECT_EQ(findMovedFile(wanted, path("a/gone"), 3), "");
-    EXPECT_EQ(findMovedFile(wanted, path("a/gone"), 4), path("c/target"));
-    EXPECT_EQ(findMovedFile(wanted, path("c/gone"), 0), "");
-    EXPECT_EQ(findMovedFile(wanted, path("c/gone"), 1), path("c/target"));
+    TestSupport::makeFolders(path("c/d"));
+    CFileIdentity const wanted = made("c/d/target");
+    // "b"; then "a" and "c", "d", and the target. What lies in "a" is not seen again.
+    EXPECT_EQ(findMovedFile(wanted, path("a/gone"), 4), "");
+    EXPECT_EQ(findMovedFile(wanted, path("a/gone"), 5), path("c/d/target"));
+    EXPECT_EQ(findMovedFile(wanted, path("c/d/gone"), 0), "");
+    EXPECT_EQ(findMovedFile(wanted, path("c/d/gone"), 1), path("c/d/target"));
 }
 
 TEST_F(CBaseMacOSIdentityTest, TheSearchDoesNotGoDownToAnotherDevice) {

@@ -1,6 +1,6 @@
 #include "1Base/BaseMacOS/BaseMacOS.h"
 
-#include "BaseMacOSSystemCalls.h"
+#include "1Base/BaseMacOS/BaseMacOSSystemCalls.h"
 #include "support/FileRoot.h"
 
 #include <cerrno>

@@ -1,4 +1,4 @@
-#include "BaseMacOSSystemCalls.h"
+#include "1Base/BaseMacOS/BaseMacOSSystemCalls.h"
 
 #include <fcntl.h>
 #include <pwd.h>

@@ -32,6 +32,10 @@ static_assert(
     exists<static_cast<CFStringRef (*)(Strings::stringUTF16 const&)>(MacOS::GetCFString)>);
 static_assert(exists<static_cast<CFStringRef (*)(unsigned char const*)>(MacOS::GetCFString)>);
 
+static_assert(std::is_same_v<decltype(MacOS::getTime), Time::CDateTime(DateTimeRec const&)>);
+static_assert(
+    std::is_same_v<decltype(MacOS::convertToPosixPath), std::string(FileSys::CFileSpec const&)>);
+
 static_assert(std::is_constructible_v<CTempCFString, CFStringRef>);
 static_assert(std::is_constructible_v<CTempCFString, CFMutableStringRef>);
 static_assert(std::is_constructible_v<CTempCFString, std::string const&>);
