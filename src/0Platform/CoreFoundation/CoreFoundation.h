@@ -19,6 +19,7 @@
 #include <CoreFoundation/CFDate.h>
 #include <CoreFoundation/CFDateFormatter.h>
 #include <CoreFoundation/CFLocale.h>
+#include <CoreFoundation/CFNumber.h>
 #include <CoreFoundation/CFString.h>
 #include <CoreFoundation/CFStringEncodingExt.h>
 #include <CoreFoundation/CFURL.h>

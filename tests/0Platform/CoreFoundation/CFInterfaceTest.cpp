@@ -23,12 +23,16 @@ static_assert(isType<CFTimeInterval, double> && isType<CFAbsoluteTime, double>);
 static_assert(isType<CFDateRef, __CFDate const*> && isType<CFLocaleRef, __CFLocale const*>);
 static_assert(isType<CFCalendarRef, __CFCalendar*> &&
               isType<CFDateFormatterRef, __CFDateFormatter*>);
-static_assert(isType<CFCalendarIdentifier, CFStringRef>);
+static_assert(isType<CFCalendarIdentifier, CFStringRef> && isType<CFLocaleKey, CFStringRef>);
+static_assert(isType<CFBooleanRef, __CFBoolean const*>);
 static_assert(isType<std::underlying_type_t<CFDateFormatterStyle>, CFIndex>);
 static_assert(isType<decltype(CFRange::location), CFIndex> &&
               isType<decltype(CFRange::length), CFIndex>);
 static_assert(isType<decltype(kCFAllocatorDefault), CFAllocatorRef const>);
 static_assert(isType<decltype(kCFGregorianCalendar), CFCalendarIdentifier const>);
+static_assert(isType<decltype(kCFLocaleUsesMetricSystem), CFLocaleKey const>);
+static_assert(isType<decltype(kCFBooleanTrue), CFBooleanRef const> &&
+              isType<decltype(kCFBooleanFalse), CFBooleanRef const>);
 static_assert(isType<decltype(kCFAbsoluteTimeIntervalSince1970), CFTimeInterval const>);
 
 static_assert(kCFStringEncodingMacRoman == 0);
@@ -54,6 +58,8 @@ static_assert(isType<decltype(CFRangeMake), CFRange(CFIndex, CFIndex)>);
 static_assert(isType<decltype(CFRetain), CFTypeRef(CFTypeRef)>);
 static_assert(isType<decltype(CFRelease), void(CFTypeRef)>);
 static_assert(isType<decltype(CFGetRetainCount), CFIndex(CFTypeRef)>);
+static_assert(isType<decltype(CFLocaleGetValue), CFTypeRef(CFLocaleRef, CFLocaleKey)>);
+static_assert(isType<decltype(CFBooleanGetValue), Boolean(CFBooleanRef)>);
 static_assert(
     isType<decltype(CFStringCreateWithBytes),
            CFStringRef(CFAllocatorRef, UInt8 const*, CFIndex, CFStringEncoding, Boolean)>);

@@ -91,6 +91,10 @@ char const* dateIdentifierOf(CFLocaleRef locale) noexcept {
     return locale != nullptr ? locale->dates.text : "";
 }
 
+char const* measureIdentifierOf(CFLocaleRef locale) noexcept {
+    return locale != nullptr ? locale->measures.text : "C";
+}
+
 } // namespace CFPlatform
 
 extern "C" CFLocaleRef CFLocaleCopyCurrent(void) {
@@ -100,5 +104,6 @@ extern "C" CFLocaleRef CFLocaleCopyCurrent(void) {
     locale->characters = nameOf(environmentLocale("LC_CTYPE"), "", "");
     char const* const dates = environmentLocale("LC_TIME");
     locale->dates = nameOf(dates, scriptOf(dates), *dates == '\0' ? "" : "C");
+    locale->measures = nameOf(environmentLocale("LC_MEASUREMENT"), "", "C");
     return locale;
 }

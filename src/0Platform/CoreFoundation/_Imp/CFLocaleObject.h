@@ -28,6 +28,9 @@ struct __CFLocale : CFPlatform::Object {
 
     /// Of dates; empty for the root locale, "C" for what is no locale's name.
     CFPlatform::LocaleName dates;
+
+    /// Of measures; "C" for what is no locale's name.
+    CFPlatform::LocaleName measures;
 };
 
 namespace CFPlatform {
@@ -39,6 +42,9 @@ char const* environmentLocale(char const* category) noexcept;
 /// The locale's names as ICU takes them. A null locale is the root locale.
 char const* characterIdentifierOf(CFLocaleRef locale) noexcept;
 char const* dateIdentifierOf(CFLocaleRef locale) noexcept;
+
+/// The same for measures, where it is "C": ICU takes the empty name for its own default.
+char const* measureIdentifierOf(CFLocaleRef locale) noexcept;
 
 } // namespace CFPlatform
 
