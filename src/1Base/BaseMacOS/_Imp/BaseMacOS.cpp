@@ -48,6 +48,10 @@ Strings::string getUserEmailAddress() {
     return fromNative(Native::getUserEmailAddress());
 }
 
+bool usesMetricSystem() {
+    return Native::usesMetricSystem();
+}
+
 bool setHiddenAttribute(Strings::string const& path, bool hidden) {
     return Native::setHiddenAttribute(toNative(path), hidden);
 }
