@@ -47,8 +47,8 @@ Strings::string getUserEmailAddress();
 
 bool usesMetricSystem();
 
-/// Sets or clears a file's hidden flag. A file system that can't hold the flag counts as success;
-/// false for a missing file or one that may not be changed.
+/// Sets or clears a file's hidden flag; a link is a file of its own. A file system that can't hold
+/// the flag counts as success; false for a missing file or one that may not be changed.
 bool setHiddenAttribute(Strings::string const& path, bool hidden);
 
 /// Writes a file that leads to `source` and goes on doing so when that is renamed or moved within
@@ -60,7 +60,7 @@ bool createBookmarkFile(Strings::string const& source, Strings::string const& bo
 bool resolveBookmarkFile(Strings::string const& bookmark, Strings::string& result);
 
 /// The path of a standard folder, which need not exist. Temporary items ignore the domain and end
-/// in a separator.
+/// in a separator. Fails the check "[a count] > 0" where the system knows no such folder.
 Strings::string getSpecialFolder(TSystemFolderType type, TSystemFolderDomain domain);
 
 /// The modifier keys at this moment; either side's key counts.

@@ -9,7 +9,6 @@
 
 #include <cerrno>
 #include <cstdint>
-#include <cstdio>
 
 namespace MacOS {
 namespace Native {

@@ -58,16 +58,16 @@ TFolder getLocalConfigFolder() {
 // ignored.
 TFolder folderOfEntry(std::string const& entry) {
     constexpr std::string_view home = "\"$HOME";
-    bool const inHome = entry.compare(0, home.size(), home) == 0;
     if (entry.empty() || entry.front() != '"')
         return {};
+    bool const isInHome = entry.compare(0, home.size(), home) == 0;
     std::optional<std::string> const path =
-        unquoted(inHome ? '"' + entry.substr(home.size()) : entry);
-    if (!path || (!inHome && path->empty()) || (!path->empty() && path->front() != '/'))
+        unquoted(isInHome ? '"' + entry.substr(home.size()) : entry);
+    bool const isValid = path && (path->empty() ? isInHome : path->front() == '/');
+    if (!isValid)
         return {};
-    if (!inHome)
-        return withoutEnd(*path);
-    return withoutEnd(within(getHomeFolder(), path->empty() ? *path : path->substr(1)));
+    return withoutEnd(isInHome ? within(getHomeFolder(), path->substr(path->empty() ? 0 : 1))
+                               : *path);
 }
 
 // The last valid entry counts, as for a shell that runs the file.
