@@ -24,7 +24,7 @@ bool putZoneType(TText& text, CTimeZone const& zone) {
         text.put('+');
         return true;
     }
-    ERROR_ASSERT(!"Unknown time zone type");
+    ERROR_ASSERT_TEXT(false, "!\"Unknown time zone type\"");
     return false;
 }
 
