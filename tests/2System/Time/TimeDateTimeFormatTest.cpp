@@ -1,6 +1,7 @@
 #include "1Base/Error/Error.h"
 #include "2System/Time/TimeDateTime.h"
 #include "2System/Time/TimeExc.h"
+#include "2System/Time/TimeLocales.h"
 #include "2System/Time/TimeOutcome.h"
 #include "2System/Time/TimeRoads.h"
 #include "support/ObjectCount.h"
@@ -102,7 +103,7 @@ TEST_F(CTimeDateTimeFormatTest, TheFillStandsBeforeASign) {
 }
 
 TEST_F(CTimeDateTimeFormatTest, ALocaleThatGroupsDigitsDoesSoHere) {
-    StdUtilTest::CGlobalLocale const global(new StdUtilTest::CGrouping);
+    TimeTest::CGroupingLocale const global('.', "\3");
     EXPECT_EQ(formatted(L"YYYY-MM-DD"), "2.021-03-05");
     EXPECT_EQ(formatted(L"tt c", CDateTime(5, CDate::emMar, 2021, 0, 0, 0, 1234567)),
               "1.234.567 123.456");

@@ -1,6 +1,7 @@
 #include "1Base/Error/Error.h"
 #include "2System/Time/TimeClockInHand.h"
 #include "2System/Time/TimeDateTime.h"
+#include "2System/Time/TimeLocales.h"
 #include "2System/Time/TimeReadOutcome.h"
 #include "2System/Time/TimeRoads.h"
 #include "support/ObjectCount.h"
@@ -80,7 +81,7 @@ TEST_F(CTimeDateTimeISOTest, BlanksFillTheYearAndZerosTheRest) {
 }
 
 TEST_F(CTimeDateTimeISOTest, ALocaleThatGroupsDigitsDoesSoHere) {
-    StdUtilTest::CGlobalLocale const global(new StdUtilTest::CGrouping);
+    TimeTest::CGroupingLocale const global('.', "\3");
     EXPECT_EQ(TimeTest::narrow(sample.getAsISOdate(CTimeZone())), "2.021-03-05T08:05:09");
 }
 
@@ -278,11 +279,7 @@ TEST_F(CTimeDateTimeISOTest, AFailureLeavesInTheZoneWhatWasRead) {
 }
 
 TEST_F(CTimeDateTimeISOTest, ALocaleThatGroupsDigitsReadsSoHere) {
-    class CCommas : public std::numpunct<char> {
-        char do_thousands_sep() const override { return ','; }
-        std::string do_grouping() const override { return "\2"; }
-    };
-    StdUtilTest::CGlobalLocale const global(new CCommas);
+    TimeTest::CGroupingLocale const global(',', "\2");
     EXPECT_EQ(readISO("2,02-03-05"), badDate("202/3/5"));
     EXPECT_EQ(readISO("2021-03-05"), "2021-3-5 0:0:0.0" + utc + "0x0007");
     EXPECT_EQ(readISO("2021-1,2"),

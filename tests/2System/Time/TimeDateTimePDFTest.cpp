@@ -1,6 +1,7 @@
 #include "1Base/Error/Error.h"
 #include "2System/Time/TimeClockInHand.h"
 #include "2System/Time/TimeDateTime.h"
+#include "2System/Time/TimeLocales.h"
 #include "2System/Time/TimeReadOutcome.h"
 #include "2System/Time/TimeRoads.h"
 #include "support/LogRecorder.h"
@@ -65,11 +66,7 @@ TEST_F(CTimeDateTimePDFTest, BlanksFillTheYearAndZerosTheRest) {
 }
 
 TEST_F(CTimeDateTimePDFTest, ALocaleThatGroupsDigitsDoesSoHere) {
-    class CCommas : public std::numpunct<char> {
-        char do_thousands_sep() const override { return ','; }
-        std::string do_grouping() const override { return "\3"; }
-    };
-    StdUtilTest::CGlobalLocale const global(new CCommas);
+    TimeTest::CGroupingLocale const global(',', "\3");
     EXPECT_EQ(sample.getAsPDFdate(CTimeZone()), "D:2,0210305080509");
 }
 
