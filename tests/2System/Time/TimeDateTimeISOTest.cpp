@@ -225,6 +225,10 @@ TEST_F(CTimeDateTimeISOTest, NoSeparatorIsTakenForZero) {
     expectRefused("2021-03-05 08:30", 0);
     expectRefused("2021-03-0508:30", 0);
     expectRefused("2021-03-05T08:30", 0);
+    expectRefused("2021-03-05\0T08:30"s, 0);
+    expectRefused("2021-03-05\0"
+                  "08:30"s,
+                  0);
 }
 
 TEST_F(CTimeDateTimeISOTest, AnEmptyTextIsMissing) {
@@ -284,6 +288,11 @@ TEST_F(CTimeDateTimeISOTest, ALocaleThatGroupsDigitsReadsSoHere) {
     EXPECT_EQ(readISO("2021-03-05"), "2021-3-5 0:0:0.0" + utc + "0x0007");
     EXPECT_EQ(readISO("2021-1,2"),
               "TimeDateTime: " + TimeTest::wrongArgument("ISO date", "2021-1,2", "Invalid format"));
+}
+
+TEST_F(CTimeDateTimeISOTest, ALocaleThatReadsNumbersItsOwnWayIsAsked) {
+    StdUtilTest::CGlobalLocale const global(new TimeTest::CNumbersAhead);
+    EXPECT_EQ(readISO("2021-03-05T12:30:45+01:30"), "2022-4-6 13:31:46.0 | 1 2:31 | 0x03BF");
 }
 
 TEST_F(CTimeDateTimeISOTest, TextsBeyondASCIIComeBackInTheFailure) {

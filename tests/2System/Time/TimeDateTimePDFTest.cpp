@@ -255,6 +255,11 @@ TEST_F(CTimeDateTimePDFTest, TimesAreNotTested) {
     expectRead("D:20210305996199+99'99'", "2021-3-5 99:61:99.0 | 1 99:99 | 0x03BF");
 }
 
+TEST_F(CTimeDateTimePDFTest, ALocaleThatReadsNumbersItsOwnWayIsAsked) {
+    StdUtilTest::CGlobalLocale const global(new TimeTest::CNumbersAhead);
+    EXPECT_EQ(readPDF("D:20210305123045+01'30'"), "2022-4-6 13:31:46.0 | 1 2:31 | 0x03BF");
+}
+
 TEST_F(CTimeDateTimePDFTest, AFailureLeavesInTheZoneWhatWasRead) {
     onBothRoads([] {
         auto const zoneAfter = [](std::string const& text) {

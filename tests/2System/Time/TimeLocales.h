@@ -1,9 +1,11 @@
-/// A global locale that groups digits, for a test's time.
+/// Global locales that treat numbers in their own way: one that groups digits, for a test's time,
+/// and facets of others.
 ///
 ///     TimeTest::CGroupingLocale const locale(',', "\3");   // 12,345,678
 #ifndef QORN_TESTS_TIMELOCALES_H
 #define QORN_TESTS_TIMELOCALES_H
 
+#include <ios>
 #include <locale>
 #include <string>
 #include <utility>
@@ -38,6 +40,17 @@ class CGroupingLocale {
 
   private:
     std::locale const before_;
+};
+
+/// Reads every number as the one behind it.
+class CNumbersAhead : public std::num_get<char> {
+  protected:
+    iter_type do_get(iter_type in, iter_type end, std::ios_base& base,
+                     std::ios_base::iostate& state, long& number) const override {
+        iter_type const last = std::num_get<char>::do_get(in, end, base, state, number);
+        ++number;
+        return last;
+    }
 };
 
 } // namespace TimeTest
