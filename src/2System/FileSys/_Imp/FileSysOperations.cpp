@@ -52,6 +52,13 @@ void doSetFileAttributes(CFileSpec const& spec, bool hidden, bool readOnly) {
     ERROR_BLOCK_END
 }
 
+// Not the opposite of exists(): a file that could not be asked about must not pass for missing.
+bool isMissing(CFileSpec const& spec) {
+    boost::system::error_code error;
+    return boost::filesystem::status(toSystemPath(spec), error).type() ==
+           boost::filesystem::file_not_found;
+}
+
 bool doCanOpen(CFileSpec const& spec, unsigned int mode) {
     ERROR_BLOCK_BEGIN
     Streams::Detail::basic_fstreamW<char> const stream(spec.getFullName(true).c_str(), mode);
@@ -88,9 +95,10 @@ void setFileAttributes(CFileSpec const& spec, bool hidden, bool readOnly) {
 
 bool canOpen(CFileSpec const& spec, unsigned int mode) {
     ERROR_BLOCK_BEGIN
-    bool const existed = spec.exists();
+    bool const wasMissing = isMissing(spec);
     bool const opened = doCanOpen(spec, mode);
-    if (opened && !existed)
+    // Then the attempt has made it.
+    if (opened && wasMissing)
         deleteFile(spec, true);
     return opened;
     ERROR_BLOCK_END

@@ -4,25 +4,42 @@
 
 #include <boost/filesystem/operations.hpp>
 
+#include <sys/stat.h>
+
+#include <cerrno>
+#include <string>
+
 namespace FileSys {
 namespace {
 
+boost::system::error_code systemError(int error) {
+    return boost::system::error_code(error, boost::system::system_category());
+}
+
 // The path library empties a file that it overwrites before it looks whether that is the source
-// under another name.
-bool isSameFile(boost::filesystem::path const& from, boost::filesystem::path const& to) {
-    boost::system::error_code error;
-    return boost::filesystem::equivalent(from, to, error) && !error;
+// under another name. So it is looked at here, and what can't be looked at is left alone.
+boost::system::error_code checkOverwriting(std::string const& from, std::string const& to) {
+    struct stat source;
+    struct stat target;
+    if (stat(to.c_str(), &target) != 0)
+        return systemError(errno == ENOENT ? 0 : errno);
+    if (stat(from.c_str(), &source) != 0)
+        return systemError(errno);
+    bool const isSame = source.st_dev == target.st_dev && source.st_ino == target.st_ino;
+    return systemError(isSame ? EEXIST : 0);
 }
 
 boost::system::error_code copyContent(CFileSpec const& from, CFileSpec const& to, bool overwrite) {
     using boost::filesystem::copy_options;
     boost::filesystem::path const source = Detail::toSystemPath(from);
     boost::filesystem::path const target = Detail::toSystemPath(to);
-    if (overwrite && isSameFile(source, target))
-        return make_error_code(boost::system::errc::file_exists);
     boost::system::error_code error;
-    boost::filesystem::copy_file(
-        source, target, overwrite ? copy_options::overwrite_existing : copy_options::none, error);
+    if (overwrite)
+        error = checkOverwriting(source.native(), target.native());
+    if (!error)
+        boost::filesystem::copy_file(
+            source, target, overwrite ? copy_options::overwrite_existing : copy_options::none,
+            error);
     return error;
 }
 

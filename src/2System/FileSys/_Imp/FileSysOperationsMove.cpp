@@ -32,7 +32,6 @@ void doMoveFile(CFileSpec const& from, CFileSpec const& to) {
 // A failure of the more special chain makes the move a copy. Those of the path library are not of
 // it and go to the caller: for them doMoveFile() has a road of its own.
 void moveOrCopy(CFileSpec const& from, CFileSpec const& to, bool overwrite) {
-    ERROR_BLOCK_BEGIN
     try {
         CFileSpec const folder = to.getParentFolder();
         if (from.isFolder() || !folder.empty())
@@ -48,7 +47,6 @@ void moveOrCopy(CFileSpec const& from, CFileSpec const& to, bool overwrite) {
         copyFile(from, to, overwrite);
         deleteFile(from, true);
     }
-    ERROR_BLOCK_END
 }
 
 void doRenameFile(CFileSpec const& fs, Strings::string const& newName) {
