@@ -26,7 +26,8 @@ void setFileAttributes(CFileSpec const& spec, bool hidden, bool readOnly);
 
 /// Copies a file or a folder with all in it, making missing folders. Where a file is there already
 /// and `overwrite` is false, that file stays, and nothing tells the caller. A failure stops the
-/// copy where it stands; what was copied stays. Special files and dangling links are left out.
+/// copy where it stands; what was copied stays. Within a folder links are followed, and special
+/// files and dangling links are left out. A file onto itself under another name fails and is whole.
 void copyFile(CFileSpec const& from, CFileSpec const& to, bool overwrite);
 void copyFileToFolder(CFileSpec const& from, CFileSpec const& folder, bool overwrite);
 

@@ -176,6 +176,14 @@ TEST_F(CCopyFileTest, ADeviceIsNoFile) {
     EXPECT_EQ(listTree(path()), TNames{"from"});
 }
 
+// Opening it would wait for somebody who writes.
+TEST_F(CCopyFileTest, AFifoIsRefusedUnopened) {
+    ASSERT_EQ(mkfifo(path("fifo").c_str(), 0600), 0);
+    CSystemCalls calls;
+    expectRefused("fifo", "to", true, ENOSYS);
+    EXPECT_EQ(calls.count("open"), 0U);
+}
+
 TEST_F(CCopyFileTest, AFolderInTheTargetsPlaceIsAFailure) {
     makeFolders(path("to/inner"));
     expectRefused("from", "to", true, EISDIR);

@@ -16,15 +16,21 @@ boost::system::error_code systemError(int error) {
     return boost::system::error_code(error, boost::system::system_category());
 }
 
-// The path library empties a file that it overwrites before it looks whether that is the source
-// under another name. So it is looked at here, and what can't be looked at is left alone.
-boost::system::error_code checkOverwriting(std::string const& from, std::string const& to) {
+// What the path library finds out too late: it waits for the other end of a FIFO before it refuses
+// it, and empties a file that it overwrites before it sees that this is the source under another
+// name. What can't be looked at is left alone.
+boost::system::error_code checkCopying(std::string const& from, std::string const& to,
+                                       bool overwrite) {
     struct stat source;
     struct stat target;
-    if (stat(to.c_str(), &target) != 0)
-        return systemError(errno == ENOENT ? 0 : errno);
     if (stat(from.c_str(), &source) != 0)
         return systemError(errno);
+    if (!S_ISREG(source.st_mode))
+        return systemError(ENOSYS);
+    if (!overwrite)
+        return systemError(0);
+    if (stat(to.c_str(), &target) != 0)
+        return systemError(errno == ENOENT ? 0 : errno);
     bool const isSame = source.st_dev == target.st_dev && source.st_ino == target.st_ino;
     return systemError(isSame ? EEXIST : 0);
 }
@@ -33,9 +39,7 @@ boost::system::error_code copyContent(CFileSpec const& from, CFileSpec const& to
     using boost::filesystem::copy_options;
     boost::filesystem::path const source = Detail::toSystemPath(from);
     boost::filesystem::path const target = Detail::toSystemPath(to);
-    boost::system::error_code error;
-    if (overwrite)
-        error = checkOverwriting(source.native(), target.native());
+    boost::system::error_code error = checkCopying(source.native(), target.native(), overwrite);
     if (!error)
         boost::filesystem::copy_file(
             source, target, overwrite ? copy_options::overwrite_existing : copy_options::none,
