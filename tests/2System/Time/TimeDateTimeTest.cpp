@@ -153,6 +153,14 @@ TEST_F(CTimeDateTimeTest, ADifferenceOfADateThatIsNoneRaises) {
     EXPECT_EQ(difference(good, bad), invalidDate);
 }
 
+TEST_F(CTimeDateTimeTest, OfTwoDatesThatAreNoneTheLeftIsNamed) {
+    CDateTime const left(brokenDown(2021, 13, 5, 0, 0, 0));
+    CDateTime const right(brokenDown(2021, 2, 30, 0, 0, 0));
+    EXPECT_EQ(outcomeOf([&] { return std::to_string(left - right); }), invalidDate);
+    EXPECT_EQ(outcomeOf([&] { return std::to_string(right - left); }),
+              TimeTest::badDate("2021/2/30"));
+}
+
 // Comparison.
 
 TEST_F(CTimeDateTimeTest, TheDateIsComparedBeforeTheTime) {

@@ -142,7 +142,8 @@ bool operator!=(CDateTime const& left, CDateTime const& right) {
 }
 
 int operator-(CDateTime const& left, CDateTime const& right) {
-    int const days = checkedDate(left) - checkedDate(right);
+    CDate const leftDate = checkedDate(left); // fails before the right one does
+    int const days = leftDate - checkedDate(right);
     int const seconds = wholeSeconds(left) - wholeSeconds(right);
     return Config::wrapAdd(Config::wrapMul(days, secondsPerDay), seconds);
 }
