@@ -3,13 +3,17 @@
 
 #include "1Base/Error/Error.h"
 #include "2System/Time/TimeDateTime.h"
+#include "2System/Time/TimeLocales.h"
+#include "2System/Time/TimePlainReaders.h"
 #include "2System/Time/TimeReadOutcome.h"
 #include "2System/Time/TimeStreamRoad.h"
 #include "support/ObjectCount.h"
 
+#include <algorithm>
 #include <cstddef>
 #include <iomanip>
 #include <limits>
+#include <map>
 #include <random>
 #include <sstream>
 #include <string>
@@ -203,6 +207,59 @@ TEST_F(CTimeDateTimeReadingRoadsTest, ZonesOfTheCharactersThatCount) {
         140, [&] { return "D:20210305123045" + zone(); }, readPDF);
 }
 
+// Random texts against readers of the tests' own, which do not know how a text that is no UTF-8
+// fails.
+template <class TMake, class TRead, class TReadPlain>
+void compareToPlain(int count, TMake const& make, TRead const& read, TReadPlain const& readPlain) {
+    for (int i = 0; i < count; ++i) {
+        std::string text = make();
+        std::replace(text.begin(), text.end(), '\xC3', 'x');
+        ASSERT_EQ(read(text), readPlain(text))
+            << "seed " << seed << ", " << testing::PrintToString(text);
+    }
+}
+
+constexpr int textsToRead = 300000;
+
+CReadOutcome readPlainISO(std::string const& text) {
+    return TimeTest::readPlainISO(text);
+}
+
+TEST_F(CTimeDateTimeReadingRoadsTest, ISODatesAreReadAsByAPlainStream) {
+    compareToPlain(
+        textsToRead, [this] { return isoText(); }, readISO, readPlainISO);
+    for (char const separator : {' ', '-', '0', '\0'})
+        compareToPlain(
+            textsToRead / 10,
+            [&] {
+                std::string text = isoText();
+                std::size_t const at = text.find('T');
+                if (at != std::string::npos && !oneIn(10))
+                    text.replace(at, 1, separator == 0 ? 0U : 1U, separator);
+                return text;
+            },
+            [&](std::string const& text) { return TimeTest::readISO(text, false, separator); },
+            [&](std::string const& text) { return TimeTest::readPlainISO(text, separator); });
+}
+
+TEST_F(CTimeDateTimeReadingRoadsTest, PDFDatesAreReadAsByAPlainStream) {
+    compareToPlain(
+        textsToRead, [this] { return pdfText(); }, readPDF, TimeTest::readPlainPDF);
+}
+
+TEST_F(CTimeDateTimeReadingRoadsTest, GroupedDatesAreReadAsByAPlainStream) {
+    TimeTest::CGroupingLocale const locale(',', "\2");
+    auto const grouped = [this](std::string text) {
+        while (oneIn(2))
+            text.insert(below(text.size() + 1), 1, ',');
+        return text;
+    };
+    compareToPlain(
+        textsToRead / 6, [&] { return grouped(isoText()); }, readISO, readPlainISO);
+    compareToPlain(
+        textsToRead / 6, [&] { return grouped(pdfText()); }, readPDF, TimeTest::readPlainPDF);
+}
+
 // Writing.
 
 class CTimeDateTimeWritingRoadsTest : public CTimeDateTimeRoadsTest {
@@ -282,26 +339,100 @@ TEST_F(CTimeDateTimeWritingRoadsTest, TextsAreThoseOfAPlainStream) {
     }
 }
 
-TEST_F(CTimeDateTimeWritingRoadsTest, Patterns) {
-    auto const pattern = [this] {
+class CTimeDateTimePatternRoadsTest : public CTimeDateTimeWritingRoadsTest {
+  protected:
+    std::wstring pattern() {
         std::wstring text;
         for (std::size_t count = below(20); count > 0; --count) {
             if (oneIn(200)) {
                 text += oneOf(std::wstring(L"xTyd\u00E9"));
             } else if (oneIn(3)) {
-                text += oneOf(std::wstring(L".,:;-_#+*%&/()= "));
+                text += oneOf(literals);
             } else {
                 wchar_t const letter = oneOf(std::wstring(L"tcsmhDMY"));
                 text += std::wstring(letter == L'Y' ? (oneIn(2) ? 2 : 4) : 1 + below(2), letter);
             }
         }
         return text;
-    };
+    }
+
+    static inline std::wstring const literals = L".,:;-_#+*%&/()= ";
+};
+
+std::string formatted(CDateTime const& value, std::wstring const& pattern) {
+    return TimeTest::outcomeOf([&] { return value.format(pattern); });
+}
+
+TEST_F(CTimeDateTimePatternRoadsTest, Patterns) {
     compareRoads(
         300, [&] { return std::make_pair(value(), pattern()); },
-        [](auto const& input) {
-            return TimeTest::outcomeOf([&] { return input.first.format(input.second); });
-        });
+        [](auto const& input) { return formatted(input.first, input.second); });
+}
+
+// By runs of one letter: no place in the pattern is looked at twice.
+class CPlainPattern {
+  public:
+    CPlainPattern(CDateTime const& value, std::wstring const& literals)
+        : value_(value), literals_(literals) {}
+
+    std::string fill(std::wstring const& pattern) {
+        std::size_t end = 0;
+        for (std::size_t pos = 0; pos < pattern.size(); pos = end) {
+            wchar_t const letter = pattern[pos];
+            end = std::min(pattern.find_first_not_of(letter, pos), pattern.size());
+            char const* reason = nullptr;
+            if (literals_.find(letter) != std::wstring::npos)
+                stream_ << pattern.substr(pos, end - pos);
+            else if (letter == L'Y')
+                reason = putYear(end - pos);
+            else
+                reason = put(letter, end - pos);
+            if (reason != nullptr)
+                return "TimeFormatError: " +
+                       TimeTest::wrongArgument("string", TimeTest::narrow(pattern), reason);
+        }
+        return TimeTest::narrow(stream_.str());
+    }
+
+  private:
+    char const* putYear(std::size_t length) {
+        if (length == 1)
+            return "Invalid format";
+        if (length != 2 && length != 4)
+            return "Invalid format string";
+        putNumber(length == 2 ? value_.getYear() % 100 : value_.getYear(), length);
+        return nullptr;
+    }
+
+    char const* put(wchar_t letter, std::size_t length) {
+        std::map<wchar_t, int> const numbers = {
+            {L'D', value_.getDay()},        {L'M', value_.getMonth()},
+            {L'h', value_.getHour()},       {L'm', value_.getMinute()},
+            {L's', value_.getSecond()},     {L'c', value_.getMilliSecond() / 10},
+            {L't', value_.getMilliSecond()}};
+        auto const number = numbers.find(letter);
+        if (number == numbers.end() || length > 2)
+            return "Invalid format string";
+        putNumber(number->second, length == 2 ? 2 : 0);
+        return nullptr;
+    }
+
+    void putNumber(int number, std::size_t width) {
+        stream_ << std::setfill(L'0') << std::setw(static_cast<int>(width)) << number;
+    }
+
+    CDateTime const value_;
+    std::wstring const literals_;
+    std::wostringstream stream_;
+};
+
+TEST_F(CTimeDateTimePatternRoadsTest, PatternsAreFilledInAsOnAPlainStream) {
+    for (int i = 0; i < valuesToWrite / 3; ++i) {
+        CDateTime const moment = value();
+        std::wstring const text = pattern();
+        ASSERT_EQ(formatted(moment, text), CPlainPattern(moment, literals).fill(text))
+            << "seed " << seed << ", " << testing::PrintToString(text);
+    }
 }
 
 } // namespace
