@@ -2,6 +2,7 @@
 
 #include "2System/Time/TimeDate.h"
 
+#include "1Base/Encoding/EncodingExc.h"
 #include "2System/Time/TimeDateFields.h"
 #include "2System/Time/TimeFailure.h"
 #include "2System/Time/TimeReading.h"
@@ -30,6 +31,7 @@ using TimeTest::TFields;
 using TimeTest::timeFailureOf;
 using TimeTest::wrongArgument;
 using TReading = TimeTest::CReading<3>;
+using namespace std::string_literals;
 
 using CTimeDateInputTest = TestSupport::CErrorTest;
 
@@ -191,6 +193,42 @@ TEST_F(CTimeDateInputTest, ALetterBeyondASCIIIsAKeyLikeAnother) {
     EXPECT_EQ(timeFailureOf([&] { CDate::readDate(delimiter); }), badDelimiter(L"\u00B7"));
 }
 
+// The key is what a wide stream makes of the one byte, which may be nothing.
+TEST_F(CTimeDateInputTest, AByteBeyondASCIIAsADelimiterIsWidenedAsOnAStream) {
+    std::istringstream stream("05\xC2\xB7"
+                              "03.2021");
+    std::wostringstream widened;
+    widened << '\xC2';
+    EXPECT_EQ(timeFailureOf([&] { CDate::readDate(stream); }), badDelimiter(widened.str()));
+}
+
+TEST_F(CTimeDateInputTest, AWordThatCannotBeQuotedFailsAsAConversion) {
+    std::istringstream stream("05.\xE9\xE9\xE9 2021");
+    EXPECT_THROW(CDate::readDate(stream), Encoding::TExcEncoding);
+    EXPECT_EQ(stream.rdstate(), std::ios_base::goodbit);
+}
+
+TEST_F(CTimeDateInputTest, AZeroIsACharacterLikeAnother) {
+    expectFailure("05\0"
+                  "03.2021"s,
+                  badDelimiter(L"\0"s), 0, "03.2021");
+    expectFailure("05.03\0"
+                  "2021"s,
+                  badDelimiter(L"\0"s), 0, "2021");
+    expectFailure("\0"
+                  "05.03.2021"s,
+                  badStream(L"is", fail), fail,
+                  "\0"
+                  "05.03.2021"s);
+    expectFailure("05.\0"
+                  "03 2021"s,
+                  badMonthName(L"\0"
+                               L"03"s),
+                  0, " 2021");
+    expectDate("05.JJJ\0 2021"s, 5, 1, 2021);
+    expectDate("05.03.2021\0"s, 5, 3, 2021, 0, "\0"s);
+}
+
 // A wide letter is compared whole: no low byte of another makes a month.
 TEST_F(CTimeDateInputTest, AWideLetterIsNoMonthByItsLowByte) {
     std::wistringstream stream(L"05.\u014A\u014A\u014A 2021");
@@ -314,6 +352,26 @@ TEST_F(CTimeDateInputTest, AWordMustBeAllOfTheMonthsText) {
 TEST_F(CTimeDateInputTest, AMonthsTextWithNothingInItIsTheEndOfTheInput) {
     for (wchar_t const* const month : {L"", L" \t", L"+", L"99999999999"})
         expectTextsFail(L"5", month, L"2021", badStream(L"issMonth", 6));
+}
+
+TEST_F(CTimeDateInputTest, AZeroInATextIsACharacterLikeAnother) {
+    EXPECT_EQ(fieldsOfTexts(L"5\0"
+                            L"6"s,
+                            L"3\0"s, L"2021\0"s),
+              TFields(5, 3, 2021));
+    EXPECT_EQ(fieldsOfTexts(L"5",
+                            L"JJJ\0"
+                            L"1"s,
+                            L"2021"),
+              TFields(5, 1, 2021));
+    expectTextsFail(L"5", L"\0"s, L"2021", badMonthName(L"\0"s));
+    expectTextsFail(L"\0"
+                    L"5"s,
+                    L"3", L"2021",
+                    badTexts(L"Date", L"2021/3/0", L"Invalid date",
+                             L"\0"
+                             L"5"s,
+                             L"3", L"2021"));
 }
 
 TEST_F(CTimeDateInputTest, AnUnreadNumberCountsAsZero) {

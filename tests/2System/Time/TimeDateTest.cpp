@@ -1,6 +1,7 @@
 // Dates as values: how they are made, what they tell, how they compare and what they look like.
 
 #include "2System/Time/TimeDate.h"
+#include "1Base/Error/ErrorMacros.h"
 #include "2System/Time/TimeDateTime.h"
 #include "2System/Time/_Imp/TimeNames.h"
 
@@ -13,7 +14,9 @@
 
 #include <gtest/gtest.h>
 
+#include <array>
 #include <climits>
+#include <cstring>
 #include <iomanip>
 #include <sstream>
 #include <string>
@@ -40,6 +43,14 @@ TEST_F(CTimeDateTest, ADateKeepsItsFields) {
     EXPECT_EQ(date.getDay(), 5);
     EXPECT_EQ(date.getMonth(), CDate::emMar);
     EXPECT_EQ(date.getYear(), 2021);
+}
+
+TEST_F(CTimeDateTest, TheFieldsLieInTheirOrder) {
+    CDate const date(5, CDate::emMar, 2021);
+    std::array<int, 3> fields = {};
+    static_assert(sizeof(fields) == sizeof(date));
+    std::memcpy(fields.data(), &date, sizeof(date));
+    EXPECT_EQ(fields, (std::array<int, 3>{5, 3, 2021}));
 }
 
 TEST_F(CTimeDateTest, ADateKeepsWhatItsTestCutsOff) {
@@ -102,6 +113,18 @@ TEST_F(CTimeDateTest, AFailureShowsTheUncutFields) {
               wrongArgument(L"Date", L"-2147483648/-2/-1", L"Invalid date"));
     EXPECT_EQ(timeFailureOf([] { CDate(1, CDate::emJan, 0); }),
               wrongArgument(L"Date", L"0/1/1", L"Invalid date"));
+}
+
+template <class TExc>
+std::string nameOf() {
+    return Error::XExc<TExc>(ERROR_ORIGIN, Error::CMessage(std::string())).getExcName();
+}
+
+TEST_F(CTimeDateTest, EachLevelOfTheFailuresHasItsName) {
+    EXPECT_EQ(nameOf<Time::TExcTimeDate>(), "TimeDate");
+    EXPECT_EQ(nameOf<Time::TExcTimeTime>(), "TimeTime");
+    EXPECT_EQ(nameOf<Time::TExcTimeDateTime>(), "TimeDateTime");
+    EXPECT_EQ(nameOf<Time::TExcTimeFormatError>(), "TimeFormatError");
 }
 
 TEST_F(CTimeDateTest, AFieldReplacesAText) {

@@ -97,6 +97,27 @@ TEST_F(CTimeDateTimeCEFACTTest, FieldsAreCutAndReadOneByOne) {
     EXPECT_EQ(read(L"20210230", 102), invalidDate("2021/2/30", "30", "02", "2021"));
 }
 
+TEST_F(CTimeDateTimeCEFACTTest, AZeroIsACharacterLikeAnother) {
+    EXPECT_EQ(read(L"2021035\0"
+                   L"1\0"
+                   L"2345"s,
+                   204),
+              "2021-3-5 1:23:45.0");
+    EXPECT_EQ(read(L"20210305\0"s, 102), "2021-3-5 0:0:0.0");
+    EXPECT_EQ(read(L"2021\0"
+                   L"305"s,
+                   102),
+              "TimeDateTime: " + TimeTest::wrongArgument("month",
+                                                         "\0"
+                                                         "3"s,
+                                                         "Invalid month name"));
+    EXPECT_EQ(read(L"2021030\0"s.substr(0, 7), 102), invalidCode("2021030"));
+    EXPECT_THROW(CDateTime::readDateTimeFromCEFACTFormatCode(L"20210305\0"
+                                                             L"12345"s,
+                                                             204),
+                 StdUtil::TExcStreamCast);
+}
+
 TEST_F(CTimeDateTimeCEFACTTest, ATimeThatIsNoNumberFailsAsACast) {
     for (wchar_t const* const text : {L"20210305xx3045", L"2021030512xx45", L"202103051230xx",
                                       L"20210305  3045", L"20210305- 3045"})

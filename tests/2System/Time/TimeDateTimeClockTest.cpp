@@ -109,6 +109,17 @@ TEST_F(CTimeDateTimeClockTest, AFailedClockStandsAtAMomentOf2036) {
     EXPECT_EQ(localAt(-2, "UTC"), "1969-12-31 23:59:58.0 0 0:0");
 }
 
+TEST_F(CTimeDateTimeClockTest, AMomentBehindAllDatesHasNoOffset) {
+    CZone const pinned("UTC");
+    CClockInHand const clock(253433923200);
+    EXPECT_EQ(show(CDateTime::getCurrentTimeUTC()), "10001-1-1 0:0:0.0");
+    EXPECT_EQ(show(CDateTime::getCurrentTimeLocal()), "10001-1-1 0:0:0.0");
+    CTimeZone zone(CTimeZone::etzPlus, 7, 7);
+    EXPECT_EQ(TimeTest::outcomeOf([&] { return CDateTime::getCurrentTimeLocal(zone); }),
+              TimeTest::badDate("10001/1/1"));
+    EXPECT_EQ(show(zone), "1 7:7");
+}
+
 TEST_F(CTimeDateTimeClockTest, AMomentThatCannotBeConvertedFailsAnAssertion) {
     CClockInHand const clock(march);
     CTimeZone zone(CTimeZone::etzPlus, 7, 7);

@@ -299,6 +299,14 @@ TEST_F(CTimeDateTimeISOTest, TextsBeyondASCIIComeBackInTheFailure) {
     expectRefused("2021-03-05T\xC3\xA9");
 }
 
+TEST_F(CTimeDateTimeISOTest, AFailureThatCannotBeQuotedIsOneOfTheConversion) {
+    onBothRoads([] {
+        for (char const* const text : {"\xFF", "2021\xFF", "2021-03-05T\xC3", "2021-03-05T12\xE9"})
+            EXPECT_EQ(readISO(text).find("Encoding: "), 0U) << text;
+    });
+    expectRead("2021-03-05T12:30\xFF", "2021-3-5 12:30:0.0" + utc + "0x001F");
+}
+
 // Into the local zone.
 
 std::string movedISO(std::string const& text) {
@@ -326,6 +334,18 @@ TEST_F(CTimeDateTimeISOTest, TheOffsetsAreSubtracted) {
         EXPECT_EQ(movedISO("2021-01-01T00:10+06"), "2020-12-31 23:40:0.0");
         EXPECT_EQ(movedISO("2021-07-05T12:30-01:30"), "2021-7-5 19:30:0.0");
         EXPECT_EQ(movedISO("2021-07-05T12:30+99:99"), "2021-7-1 13:21:0.0");
+    });
+}
+
+TEST_F(CTimeDateTimeISOTest, AnHourOutOfTheDayIsRolledByAMoveOnly) {
+    CClockInHand const clock(march);
+    onBothRoads([] {
+        CZone const utcZone("UTC");
+        EXPECT_EQ(movedISO("2021-03-05T99:00Z"), "2021-3-5 99:0:0.0");
+        EXPECT_EQ(movedISO("2021-03-05T99:61:62"), "2021-3-5 99:61:62.0");
+        CZone const zone("Asia/Kolkata");
+        EXPECT_EQ(movedISO("2021-03-05T99:00+05:30"), "2021-3-5 99:0:0.0");
+        EXPECT_EQ(movedISO("2021-03-05T99:00Z"), "2021-3-6 80:30:0.0");
     });
 }
 

@@ -285,6 +285,14 @@ TEST_F(CTimeDateTimePDFTest, ABadDateIsLogged) {
               L"'Time::CDate::CDate()': Invalid date \"2021/2/30\"!");
 }
 
+TEST_F(CTimeDateTimePDFTest, AFailureThatCannotBeQuotedIsOneOfTheConversion) {
+    onBothRoads([] {
+        for (char const* const text : {"\xFE\xFF", "D:2021\xFF", "D:20210305+\xC3", "D\xE9"})
+            EXPECT_EQ(readPDF(text).find("Encoding: "), 0U) << text;
+    });
+    expectRead("D:20210305Z\xFF", "2021-3-5 0:0:0.0 | 0 0:0 | 0x00BF");
+}
+
 // Into the local zone.
 
 std::string movedPDF(std::string const& text) {
@@ -313,6 +321,18 @@ TEST_F(CTimeDateTimePDFTest, TheOffsetsAreSubtracted) {
         // No offset is no zone to the caller, but it is moved.
         EXPECT_EQ(readPDF("D:20210705123000+00'00'", true), "2021-7-5 18:0:0.0 | -2 0:0 | 0x03BF");
         EXPECT_EQ(movedPDF("D:2021+01'00'"), "2021-1-1 4:30:0.0");
+    });
+}
+
+TEST_F(CTimeDateTimePDFTest, AnHourOutOfTheDayIsRolledByAMoveOnly) {
+    CClockInHand const clock(march);
+    onBothRoads([] {
+        CZone const utcZone("UTC");
+        EXPECT_EQ(movedPDF("D:20210305990000Z"), "2021-3-5 99:0:0.0");
+        CZone const zone("Asia/Kolkata");
+        EXPECT_EQ(movedPDF("D:20210305990000+05'30'"), "2021-3-5 99:0:0.0");
+        EXPECT_EQ(movedPDF("D:20210305990000"), "2021-3-5 99:0:0.0");
+        EXPECT_EQ(movedPDF("D:20210305990000Z"), "2021-3-6 80:30:0.0");
     });
 }
 

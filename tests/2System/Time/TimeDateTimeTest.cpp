@@ -3,8 +3,12 @@
 #include "1Base/Error/Error.h"
 #include "2System/Time/TimeExc.h"
 #include "2System/Time/TimeOutcome.h"
+#include "support/LogRecorder.h"
 #include "support/ObjectCount.h"
+#include "support/TextFailures.h"
 
+#include <array>
+#include <cstring>
 #include <ctime>
 #include <limits>
 #include <sstream>
@@ -69,6 +73,14 @@ TEST_F(CTimeDateTimeTest, ABrokenDownTimeIsTakenAsItIs) {
     EXPECT_EQ(show(CDateTime(brokenDown(1066, 0, 77, 99, 60, 61))), "1066-0-77 99:60:61.0");
 }
 
+TEST_F(CTimeDateTimeTest, TheDateLiesBeforeTheTime) {
+    CDateTime const value = moment(2021, 3, 5, 8, 5, 9, 123);
+    std::array<int, 7> fields = {};
+    static_assert(sizeof(fields) == sizeof(value));
+    std::memcpy(fields.data(), &value, sizeof(value));
+    EXPECT_EQ(fields, (std::array<int, 7>{5, 3, 2021, 123, 9, 5, 8}));
+}
+
 // Seconds.
 
 CDateTime plus(CDateTime value, unsigned int seconds) {
@@ -119,6 +131,16 @@ TEST_F(CTimeDateTimeTest, ExtremeTimesWrap) {
               "2021-3-5 " + std::to_string(highest) + ":59:59.0");
 }
 
+TEST_F(CTimeDateTimeTest, ADateThatIsNotCountedWithKeepsItsTime) {
+    CDateTime value(brokenDown(2021, -1, 5, 8, 5, 9));
+    char const* const text = "1<=month && 12>=month";
+    EXPECT_EQ(TestSupport::failedCheckOf([&] { value.addSeconds(1); }), text);
+    EXPECT_EQ(show(value), "2021--1-5 8:5:9.0");
+    CDateTime behind(brokenDown(2021, 14, 5, 8, 5, 9));
+    EXPECT_EQ(TestSupport::failedCheckOf([&] { behind.subSeconds(1); }), text);
+    EXPECT_EQ(show(behind), "2021-14-5 8:5:9.0");
+}
+
 // Differences.
 
 TEST_F(CTimeDateTimeTest, ADifferenceIsOneOfSeconds) {
@@ -159,6 +181,16 @@ TEST_F(CTimeDateTimeTest, OfTwoDatesThatAreNoneTheLeftIsNamed) {
     EXPECT_EQ(outcomeOf([&] { return std::to_string(left - right); }), invalidDate);
     EXPECT_EQ(outcomeOf([&] { return std::to_string(right - left); }),
               TimeTest::badDate("2021/2/30"));
+}
+
+TEST_F(CTimeDateTimeTest, ADifferenceOfADateThatIsNoneIsLogged) {
+    TestSupport::CLogRecorder const recorder;
+    TestSupport::CInstalledTarget<Error::TTgtLogger, Error::TSevError> const installed(recorder);
+    CDateTime const bad(brokenDown(2021, 13, 5, 0, 0, 0));
+    EXPECT_EQ(outcomeOf([&] { return std::to_string(bad - bad); }), invalidDate);
+    ASSERT_EQ(recorder.records().size(), 1U);
+    EXPECT_EQ(recorder.records()[0].expanded,
+              L"'Time::CDate::CDate()': Invalid date \"2021/13/5\"!");
 }
 
 // Comparison.

@@ -120,6 +120,18 @@ static_assert(CTimeZone::etzNone == -2 && CTimeZone::etzMinus == -1 && CTimeZone
               CTimeZone::etzPlus == 1);
 static_assert(isOverload<int (CTimeZone::*)() const>(&CTimeZone::getSeconds));
 
+// The order of the parents is part of the type.
+template <template <class> class TName, class... TParents>
+using TChain = Error::TExc<TemplMeta::CTag<TName<char const*>>, TParents...>;
+static_assert(
+    std::is_same_v<Time::TExcTimeDate, TChain<Time::CTag_Name_TimeDate, Error::CException>>);
+static_assert(
+    std::is_same_v<Time::TExcTimeTime, TChain<Time::CTag_Name_TimeTime, Error::CException>>);
+static_assert(
+    std::is_same_v<Time::TExcTimeDateTime,
+                   TChain<Time::CTag_Name_TimeDateTime, Time::TExcTimeDate, Time::TExcTimeTime>>);
+static_assert(std::is_same_v<Time::TExcTimeFormatError,
+                             TChain<Time::CTag_Name_TimeFormatError, Time::TExcTimeDateTime>>);
 static_assert(std::is_base_of_v<Error::CException, Time::TExcTimeDate>);
 static_assert(std::is_base_of_v<Error::CException, Time::TExcTimeTime>);
 static_assert(std::is_base_of_v<Time::TExcTimeDate, Time::TExcTimeDateTime>);

@@ -21,6 +21,7 @@ using TimeTest::badStream;
 using TimeTest::CTimeFailure;
 using TimeTest::timeFailureOf;
 using TReading = TimeTest::CReading<4>;
+using namespace std::string_literals;
 
 using CTimeTimeInputTest = TestSupport::CErrorTest;
 
@@ -126,6 +127,19 @@ TEST_F(CTimeTimeInputTest, AStreamThatHasFailedIsRefusedAtOnce) {
     EXPECT_EQ(timeFailureOf([&] { CTime::readTime(stream); }), badStream(L"is", 3));
     stream.clear();
     EXPECT_EQ(CTime::readTime(stream).getHour(), 8);
+}
+
+TEST_F(CTimeTimeInputTest, AZeroIsACharacterLikeAnother) {
+    expectFailure("08\0"
+                  "05"s,
+                  badDelimiter(L"\0"s), 0, "05");
+    expectFailure("08:05\0"
+                  "09"s,
+                  badDelimiter(L"\0"s), 0, "09");
+    expectTime("08:05:09\0"
+               "123"s,
+               {8, 5, 9, 0}, 0, "123");
+    expectTime("08:05:09:123\0"s, {8, 5, 9, 123}, 0, "\0"s);
 }
 
 TEST_F(CTimeTimeInputTest, AWideDelimiterIsAKeyAsItIs) {

@@ -12,6 +12,7 @@
 #include <climits>
 #include <cstdint>
 #include <cstdio>
+#include <cstring>
 #include <ctime>
 #include <iomanip>
 #include <iterator>
@@ -59,6 +60,14 @@ TFields decremented(CTime time) {
 TEST_F(CTimeTimeTest, ATimeKeepsWhateverItIsGiven) {
     EXPECT_EQ(fieldsOf(CTime(8, 5, 9, 123)), (TFields{8, 5, 9, 123}));
     EXPECT_EQ(fieldsOf(CTime(99, -1, INT_MIN, INT_MAX)), (TFields{99, -1, INT_MIN, INT_MAX}));
+}
+
+TEST_F(CTimeTimeTest, TheFieldsLieInTheirOrder) {
+    CTime const time(8, 5, 9, 123);
+    std::array<int, 4> fields = {};
+    static_assert(sizeof(fields) == sizeof(time));
+    std::memcpy(fields.data(), &time, sizeof(time));
+    EXPECT_EQ(fields, (std::array<int, 4>{123, 9, 5, 8}));
 }
 
 TEST_F(CTimeTimeTest, AStructOfTheCLibraryHasNoMilliseconds) {
@@ -323,6 +332,14 @@ TEST_F(CTimeTimeZoneTest, AZoneIsUnknownByItself) {
     EXPECT_EQ(zone.hours, 0);
     EXPECT_EQ(zone.minutes, 0);
     EXPECT_EQ(zone.getSeconds(), 0);
+}
+
+TEST_F(CTimeTimeZoneTest, TheFieldsLieInTheirOrder) {
+    CTimeZone const zone(CTimeZone::etzMinus, 5, 30);
+    std::array<int, 3> fields = {};
+    static_assert(sizeof(fields) == sizeof(zone));
+    std::memcpy(fields.data(), &zone, sizeof(zone));
+    EXPECT_EQ(fields, (std::array<int, 3>{-1, 5, 30}));
 }
 
 TEST_F(CTimeTimeZoneTest, OnlyTheTypeBehindUTCNegates) {
