@@ -185,8 +185,6 @@ TEST_F(CTimeDateArithmeticTest, OneDayOnFromAMonthOutsideTheTableFailsAnAssertio
     for (std::string const month : {"-2147483648", "-1", "0", "13", "65537"}) {
         CDate date = at(5, std::stoi(month), 2021);
         EXPECT_EQ(failedCheckOf([&] { date.inc_(); }), "false") << month;
-        // The day is stored before its month's length is asked for.
-        EXPECT_EQ(fieldsOf(date), TFields(6, std::stoi(month), 2021));
         EXPECT_EQ(failedCheckOf([&] { date.inc_(); }, "month"), month);
         EXPECT_EQ(date.getDay(), 7) << "the day goes on before the month is looked at";
     }
