@@ -5,6 +5,7 @@
 #include "1Base/Encoding/EncodingExc.h"
 #include "2System/Time/TimeDateFields.h"
 #include "2System/Time/TimeFailure.h"
+#include "2System/Time/TimeFailureLines.h"
 #include "2System/Time/TimeReading.h"
 #include "2System/Time/TimeScanner.h"
 #include "support/LogRecorder.h"
@@ -175,6 +176,15 @@ TEST_F(CTimeDateInputTest, ATextThatEndsTooEarlyIsTheEndOfTheInput) {
     for (char const* const text : {"", " ", "05", "05 ", "05.", "05. ", "05.03", "05.03 ", "05.03.",
                                    "05.03. ", "05.JJJ", "05.JJJ ", "+", "05.-"})
         expectFailure(text, badStream(L"is", eof | fail), eof | fail);
+}
+
+TEST_F(CTimeDateInputTest, AFailureNamesTheLineOfItsStep) {
+    auto const read = [](std::string const& text) {
+        std::istringstream stream(text);
+        CDate::readDate(stream);
+    };
+    TimeTest::expectLinesInOrder(
+        {"x", "05", "05x", "05.", "05.03", "05.03x", "05.03.", "31.02.2021"}, read);
 }
 
 TEST_F(CTimeDateInputTest, ATextThatGoesWrongIsABadStream) {

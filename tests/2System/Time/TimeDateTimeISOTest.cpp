@@ -1,6 +1,7 @@
 #include "1Base/Error/Error.h"
 #include "2System/Time/TimeClockInHand.h"
 #include "2System/Time/TimeDateTime.h"
+#include "2System/Time/TimeFailureLines.h"
 #include "2System/Time/TimeLocales.h"
 #include "2System/Time/TimeReadOutcome.h"
 #include "2System/Time/TimeRoads.h"
@@ -258,6 +259,17 @@ TEST_F(CTimeDateTimeISOTest, BlanksAloneAreNoDate) {
     expectRead("   ", badDate("0/1/1"));
     for (char const* const text : {" ", "  ", "    ", "     "})
         expectRefused(text);
+}
+
+TEST_F(CTimeDateTimeISOTest, AFailureNamesTheLineOfItsPart) {
+    auto const read = [](std::string const& text) {
+        CDateTime::readDateTimeFromISO(text, 'T', nullptr);
+    };
+    TimeTest::expectLinesInOrder(
+        {"x", "2021x", "2021-x", "2021-03x", "2021-03-x", "2021-03-05x", "2021-03-05Tx",
+         "2021-03-05T12x", "2021-03-05T12:x", "2021-03-05T12:30:x", "2021-03-05T12:30:45.x",
+         "2021-03-05T12:30:45+x", "2021-03-05T12:30:45+01x", "2021-03-05T12:30:45+01:x"},
+        read);
 }
 
 TEST_F(CTimeDateTimeISOTest, TimesAreNotTested) {

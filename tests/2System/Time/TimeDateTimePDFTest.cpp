@@ -1,6 +1,7 @@
 #include "1Base/Error/Error.h"
 #include "2System/Time/TimeClockInHand.h"
 #include "2System/Time/TimeDateTime.h"
+#include "2System/Time/TimeFailureLines.h"
 #include "2System/Time/TimeLocales.h"
 #include "2System/Time/TimeReadOutcome.h"
 #include "2System/Time/TimeRoads.h"
@@ -248,6 +249,14 @@ TEST_F(CTimeDateTimePDFTest, MonthAndDateAreTestedBeforeTheZone) {
     expectRead("D:20210230120000X", badDate("2021/2/30"));
     expectRead("D:13991231", badDate("1399/12/31"));
     expectRead("D:14000101", "1400-1-1 0:0:0.0" + none + "0x0007");
+}
+
+TEST_F(CTimeDateTimePDFTest, AFailureNamesTheLineOfItsPart) {
+    auto const read = [](std::string const& text) {
+        CDateTime::readDateTimeFromPDF(text, nullptr);
+    };
+    TimeTest::expectLinesInOrder(
+        {"Dx", "D:x", "D:2021x", "D:2021+x", "D:2021+01x", "D:2021+01'30x", "D:2021+01'x"}, read);
 }
 
 TEST_F(CTimeDateTimePDFTest, TimesAreNotTested) {

@@ -3,6 +3,7 @@
 #include "2System/Time/TimeTime.h"
 
 #include "2System/Time/TimeFailure.h"
+#include "2System/Time/TimeFailureLines.h"
 #include "2System/Time/TimeReading.h"
 #include "2System/Time/TimeScanner.h"
 #include "support/Registry.h"
@@ -108,6 +109,15 @@ TEST_F(CTimeTimeInputTest, ATextThatEndsTooEarlyIsTheEndOfTheInput) {
     for (char const* const text :
          {"", " ", "08", "08 ", "08:", "08: ", "08:05:", "08:05: ", "08:05:09:", "08:05:09: ", "-"})
         expectFailure(text, badStream(L"is", eof | fail), eof | fail);
+}
+
+TEST_F(CTimeTimeInputTest, AFailureNamesTheLineOfItsStep) {
+    auto const read = [](std::string const& text) {
+        std::istringstream stream(text);
+        CTime::readTime(stream);
+    };
+    TimeTest::expectLinesInOrder(
+        {"x", "08", "08x", "08:", "08:05 ", "08:05x", "08:05:", "08:05:09 ", "08:05:09:x"}, read);
 }
 
 TEST_F(CTimeTimeInputTest, ATextThatGoesWrongIsABadStream) {

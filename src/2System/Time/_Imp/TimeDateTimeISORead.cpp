@@ -114,29 +114,29 @@ class CStreamReader {
 
     void read(char separator, CReading& reading, CTimeZone& zone) {
         stream_ >> std::ws;
-        readPart(reading, CDateTime::epYear, 4, reading.year);
-        checkISOStream('-');
+        readPart(reading, CDateTime::epYear, 4, reading.year, __LINE__);
+        checkISOStream('-', __LINE__);
         if (isAtEnd())
             return;
-        readPart(reading, CDateTime::epMonth, 2, reading.month);
-        checkISOStream('-');
+        readPart(reading, CDateTime::epMonth, 2, reading.month, __LINE__);
+        checkISOStream('-', __LINE__);
         if (isAtEnd())
             return;
-        readPart(reading, CDateTime::epDay, 2, reading.day);
-        checkISOStream(separator);
+        readPart(reading, CDateTime::epDay, 2, reading.day, __LINE__);
+        checkISOStream(separator, __LINE__);
         if (isAtEnd())
             return;
-        readPart(reading, CDateTime::epHour, 2, reading.hour);
-        checkISOStream(':');
+        readPart(reading, CDateTime::epHour, 2, reading.hour, __LINE__);
+        checkISOStream(':', __LINE__);
         if (isAtEnd())
             return;
-        readPart(reading, CDateTime::epMinute, 2, reading.minute);
+        readPart(reading, CDateTime::epMinute, 2, reading.minute, __LINE__);
         if (take(':')) {
-            readPart(reading, CDateTime::epSecond, 2, reading.second);
-            checkISOStream(0);
+            readPart(reading, CDateTime::epSecond, 2, reading.second, __LINE__);
+            checkISOStream(0, __LINE__);
             if (take('.')) {
-                readPart(reading, CDateTime::epFraction, 2, reading.milliSecond);
-                checkISOStream(0);
+                readPart(reading, CDateTime::epFraction, 2, reading.milliSecond, __LINE__);
+                checkISOStream(0, __LINE__);
             }
         }
         readZone(reading, zone);
@@ -154,13 +154,13 @@ class CStreamReader {
             zone.type = CTimeZone::etzPlus;
         else
             return;
-        readPart(reading, CDateTime::epZone | CDateTime::epZoneHours, 2, zone.hours);
-        checkISOStream(0);
-        checkISOStream(':');
+        readPart(reading, CDateTime::epZone | CDateTime::epZoneHours, 2, zone.hours, __LINE__);
+        checkISOStream(0, __LINE__);
+        checkISOStream(':', __LINE__);
         if (isAtEnd())
             return;
-        readPart(reading, CDateTime::epZoneMinutes, 2, zone.minutes);
-        checkISOStream(0);
+        readPart(reading, CDateTime::epZoneMinutes, 2, zone.minutes, __LINE__);
+        checkISOStream(0, __LINE__);
     }
 
     bool isAtEnd() const { return stream_.eof(); }
@@ -172,38 +172,41 @@ class CStreamReader {
         return true;
     }
 
-    void readPart(CReading& reading, int part, int length, Int32& number) {
+    void readPart(CReading& reading, int part, int length, Int32& number, unsigned int line) {
         std::streampos const start = stream_.tellg();
         stream_ >> number;
-        checkISOPartLen(start, length, number);
+        checkISOPartLen(start, length, number, line);
         reading.add(part);
     }
 
     // A part takes exactly `expected` characters, blanks and sign included. Only a stream that is
     // not at its end tells its position.
-    void checkISOPartLen(std::streampos start, int expected, Int32 number) {
+    void checkISOPartLen(std::streampos start, int expected, Int32 number, unsigned int line) {
         bool const wasAtEnd = isAtEnd();
         if (wasAtEnd)
             stream_.clear();
         if (number < 0 || stream_.tellg() - start != expected)
-            throwInvalidFormat();
+            throwInvalidFormat(line);
         if (wasAtEnd)
             stream_.setstate(std::ios_base::eofbit);
     }
 
     // Nothing has to follow at the end. A delimiter of 0 stands for none.
-    void checkISOStream(char delimiter) {
+    void checkISOStream(char delimiter, unsigned int line) {
         if (isAtEnd())
             return;
         char character = delimiter;
         if (delimiter != 0)
             stream_.get(character);
         if (stream_.fail() || character != delimiter)
-            throwInvalidFormat();
+            throwInvalidFormat(line);
     }
 
-    [[noreturn]] void throwInvalidFormat() const {
-        ERROR_THROW(TExcTimeDateTime, Detail::wrongArgument(isoDate, text_, "Invalid format"));
+    // All parts fail alike: the line tells which one it was.
+    [[noreturn]] void throwInvalidFormat(unsigned int line) const {
+        throw Error::XExc<TExcTimeDateTime>(
+            __FILE__, line, __PRETTY_FUNCTION__, __DATE__, __TIME__,
+            Detail::wrongArgument(isoDate, text_, "Invalid format"));
     }
 
     std::string const& text_;

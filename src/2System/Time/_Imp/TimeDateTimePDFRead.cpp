@@ -31,10 +31,10 @@ class CPDFReader {
     void readDate(CReading& reading) {
         if (text_[0] == 'D') {
             if (text_[1] != ':')
-                throwInvalidFormat();
+                throwInvalidFormat(__LINE__);
             pos_ = 2;
         }
-        readPDFDateObject(reading.year, 4, true);
+        readPDFDateObject(reading.year, 4, true, __LINE__);
         reading.add(CDateTime::epYear);
         struct CObject {
             CDateTime::EParts part;
@@ -47,7 +47,7 @@ class CPDFReader {
               CObject{CDateTime::epSecond, reading.second}}) {
             if (isAtEnd())
                 return;
-            readPDFDateObject(object.number, 2, false);
+            readPDFDateObject(object.number, 2, false, __LINE__);
             reading.add(object.part);
         }
     }
@@ -62,21 +62,21 @@ class CPDFReader {
 
   private:
     // Passes `length` characters, however many of them the number takes.
-    void readPDFDateObject(Int32& value, int length, bool required) {
+    void readPDFDateObject(Int32& value, int length, bool required, unsigned int line) {
         char const* const next = text_.c_str() + pos_;
         if (!required && !Detail::isDigit(*next))
             return;
         if (isLocaleClassic_ && Detail::areDigits(next, length))
             value = Detail::numberIn(next, length);
         else
-            readByStream(value, length);
+            readByStream(value, length, line);
         pos_ += static_cast<std::size_t>(length);
     }
 
-    void readByStream(Int32& value, int length) const {
+    void readByStream(Int32& value, int length, unsigned int line) const {
         std::istringstream stream(text_.substr(pos_, static_cast<std::size_t>(length)));
         stream >> value;
-        checkStream(stream);
+        checkStream(stream, line);
     }
 
     // "Z", or an offset of two digits each; the last apostrophe may be missing.
@@ -110,17 +110,17 @@ class CPDFReader {
             return;
         }
         if (designator != '+' && designator != '-')
-            throwInvalidFormat();
+            throwInvalidFormat(__LINE__);
         zone.type = designator == '+' ? CTimeZone::etzPlus : CTimeZone::etzMinus;
         stream >> zone.hours;
-        checkStream(stream);
-        checkApostrophe(stream);
+        checkStream(stream, __LINE__);
+        checkApostrophe(stream, __LINE__);
         stream >> zone.minutes;
         bool const goesOn = stream.good();
         if (goesOn)
-            checkApostrophe(stream);
+            checkApostrophe(stream, __LINE__);
         else if (!stream.eof())
-            throwInvalidFormat();
+            throwInvalidFormat(__LINE__);
         addOffsetParts(reading, goesOn);
     }
 
@@ -131,17 +131,22 @@ class CPDFReader {
             reading.add(CDateTime::epZoneMinutes);
     }
 
-    void checkApostrophe(std::istream& stream) const {
+    // All parts fail alike: the line tells which one it was.
+
+    void checkApostrophe(std::istream& stream, unsigned int line) const {
         if (!Streams::readDelimiter(stream, '\''))
-            throwInvalidFormat();
+            throwInvalidFormat(line);
     }
 
-    void checkStream(std::istream const& stream) const {
-        Detail::checkInputStream(stream, "iss", Error::COrigin(ERROR_ORIGIN),
-                                 [this] { return invalidFormat(); });
+    void checkStream(std::istream const& stream, unsigned int line) const {
+        Error::COrigin const origin(__FILE__, line, __PRETTY_FUNCTION__, __DATE__, __TIME__);
+        Detail::checkInputStream(stream, "iss", origin, [this] { return invalidFormat(); });
     }
 
-    [[noreturn]] void throwInvalidFormat() const { ERROR_THROW(TExcTimeDateTime, invalidFormat()); }
+    [[noreturn]] void throwInvalidFormat(unsigned int line) const {
+        throw Error::XExc<TExcTimeDateTime>(__FILE__, line, __PRETTY_FUNCTION__, __DATE__, __TIME__,
+                                            invalidFormat());
+    }
 
     Error::CMessage invalidFormat() const {
         return Detail::wrongArgument(pdfDate, text_, "Invalid format");
