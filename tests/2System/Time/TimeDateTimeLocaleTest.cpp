@@ -1,15 +1,19 @@
 // The texts of the user's locale: what is asked of the platform, and how the two halves are joined.
 
-#include "0Platform/CoreFoundation/CFDateTwin.h"
 #include "1Base/Error/Error.h"
 #include "2System/Time/TimeDateTime.h"
 #include "2System/Time/TimeOutcome.h"
+#include "support/ObjectCount.h"
+#include "support/PlatformString.h"
 #include "support/TableFile.h"
 #include "support/TextFailures.h"
 
 #include <CoreFoundation/CoreFoundation.h>
 
+#include <unicode/uversion.h>
+
 #include <cstdio>
+#include <cstdlib>
 #include <ctime>
 #include <map>
 #include <set>
@@ -66,10 +70,22 @@ CFStringRef __wrap_CFDateFormatterCreateStringWithDate(CFAllocatorRef allocator,
 
 namespace {
 
-class CTimeDateTimeLocaleTest : public TestSupport::CDateTest {
+// Each test runs in a process of its own, so the environment is its to change.
+void setLocale(std::string const& name) {
+    setenv("LC_ALL", name.c_str(), 1);
+}
+
+void setZone(std::string const& name) {
+    setenv("TZ", name.c_str(), 1);
+}
+
+class CTimeDateTimeLocaleTest : public TestSupport::CObjectCountTest {
   protected:
     void SetUp() override {
-        CDateTest::SetUp();
+        CObjectCountTest::SetUp();
+        // An empty LC_ALL leaves it to these.
+        for (char const* const variable : {"LC_TIME", "LANG"})
+            unsetenv(variable);
         setLocale("en_GB");
         setZone("UTC");
         calls.clear();
@@ -101,28 +117,51 @@ CDateTime valueOf(std::string const& moment) {
     return CDateTime(time);
 }
 
-// Where another ICU is at hand, its own texts.
-std::string textOf(std::vector<std::string> const& row) {
-    std::u16string units = TestSupport::unitsOfHex(row[6]);
-    if (!TestSupport::isRecordedIcu()) {
-        CDateTime const value = valueOf(row[4]);
-        CFAbsoluteTime const at = TestSupport::twinComposed(
-            row[1], {value.getYear(), value.getMonth(), value.getDay(), value.getHour(),
-                     value.getMinute(), value.getSecond()});
-        units = TestSupport::twinText(row[0], row[1], at,
-                                      static_cast<CFDateFormatterStyle>(std::stoi(row[2])),
-                                      static_cast<CFDateFormatterStyle>(std::stoi(row[3])));
-    }
-    return Encoding::convert<std::string>(Strings::stringUTF16(units.begin(), units.end()));
+bool isRecordedIcu() {
+    UVersionInfo version;
+    u_getVersion(version);
+    return version[0] == 72;
 }
 
+// What the platform says of one half.
+std::u16string platformText(CRow const& row) {
+    CFCalendarRef const calendar =
+        CFCalendarCreateWithIdentifier(kCFAllocatorDefault, kCFGregorianCalendar);
+    CFAbsoluteTime at = 0;
+    CFCalendarComposeAbsoluteTime(
+        calendar, &at, "yMdHms", row.value.getYear(), static_cast<int>(row.value.getMonth()),
+        row.value.getDay(), row.value.getHour(), row.value.getMinute(), row.value.getSecond());
+    CFDateRef const date = CFDateCreate(kCFAllocatorDefault, at);
+    CFLocaleRef const locale = CFLocaleCopyCurrent();
+    CFDateFormatterRef const formatter = CFDateFormatterCreate(
+        kCFAllocatorDefault, locale, static_cast<CFDateFormatterStyle>(row.dateFormat),
+        static_cast<CFDateFormatterStyle>(row.timeFormat));
+    TestSupport::CPlatformString const text(
+        CFDateFormatterCreateStringWithDate(kCFAllocatorDefault, formatter, date));
+    for (CFTypeRef const object :
+         {CFTypeRef(calendar), CFTypeRef(date), CFTypeRef(locale), CFTypeRef(formatter)})
+        CFRelease(object);
+    return text.units();
+}
+
+// The recorded answers; where another ICU is at hand, the texts that the platform gives with it.
 std::vector<CRow> readRows() {
     std::vector<CRow> rows;
-    for (std::vector<std::string> const& row : TestSupport::readTable("dates.tsv"))
-        rows.push_back({row.at(0), row.at(1), row.at(4),
-                        static_cast<CDateTime::EFormat>(std::stoi(row.at(2))),
-                        static_cast<CDateTime::EFormat>(std::stoi(row.at(3))), valueOf(row.at(4)),
-                        textOf(row)});
+    for (std::vector<std::string> const& columns : TestSupport::readTable("dates.tsv")) {
+        CRow row = {columns.at(0),
+                    columns.at(1),
+                    columns.at(4),
+                    static_cast<CDateTime::EFormat>(std::stoi(columns.at(2))),
+                    static_cast<CDateTime::EFormat>(std::stoi(columns.at(3))),
+                    valueOf(columns.at(4)),
+                    ""};
+        setLocale(row.locale);
+        setZone(row.zone);
+        std::u16string const units =
+            isRecordedIcu() ? TestSupport::unitsOfHex(columns.at(6)) : platformText(row);
+        row.text = Encoding::convert<std::string>(Strings::stringUTF16(units.begin(), units.end()));
+        rows.push_back(row);
+    }
     return rows;
 }
 
