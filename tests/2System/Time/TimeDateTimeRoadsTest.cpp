@@ -427,7 +427,7 @@ class CPlainPattern {
 };
 
 TEST_F(CTimeDateTimePatternRoadsTest, PatternsAreFilledInAsOnAPlainStream) {
-    for (int i = 0; i < valuesToWrite / 3; ++i) {
+    for (std::size_t i = 0; i < valuesToWrite / 3; ++i) {
         CDateTime const moment = value();
         std::wstring const text = pattern();
         ASSERT_EQ(formatted(moment, text), CPlainPattern(moment, literals).fill(text))
