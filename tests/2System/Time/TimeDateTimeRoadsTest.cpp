@@ -210,8 +210,9 @@ TEST_F(CTimeDateTimeReadingRoadsTest, ZonesOfTheCharactersThatCount) {
 // Random texts against readers of the tests' own, which do not know how a text that is no UTF-8
 // fails.
 template <class TMake, class TRead, class TReadPlain>
-void compareToPlain(int count, TMake const& make, TRead const& read, TReadPlain const& readPlain) {
-    for (int i = 0; i < count; ++i) {
+void compareToPlain(std::size_t count, TMake const& make, TRead const& read,
+                    TReadPlain const& readPlain) {
+    for (std::size_t i = 0; i < count; ++i) {
         std::string text = make();
         std::replace(text.begin(), text.end(), '\xC3', 'x');
         ASSERT_EQ(read(text), readPlain(text))
@@ -219,7 +220,7 @@ void compareToPlain(int count, TMake const& make, TRead const& read, TReadPlain 
     }
 }
 
-constexpr int textsToRead = 300000;
+constexpr std::size_t textsToRead = 300000 / slowness;
 
 CReadOutcome readPlainISO(std::string const& text) {
     return TimeTest::readPlainISO(text);
