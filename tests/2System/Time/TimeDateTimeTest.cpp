@@ -1,6 +1,7 @@
 #include "2System/Time/TimeDateTime.h"
 
 #include "1Base/Error/Error.h"
+#include "2System/Time/TimeDateFields.h"
 #include "2System/Time/TimeExc.h"
 #include "2System/Time/TimeOutcome.h"
 #include "support/LogRecorder.h"
@@ -9,9 +10,12 @@
 #include "support/Zone.h"
 
 #include <array>
+#include <cstdio>
 #include <cstring>
 #include <ctime>
+#include <iterator>
 #include <limits>
+#include <random>
 #include <sstream>
 #include <string>
 #include <type_traits>
@@ -212,6 +216,52 @@ TEST_F(CTimeDateTimeTest, MilliSecondsAreNotCompared) {
     CDateTime const right = moment(2021, 3, 5, 8, 5, 9, 999);
     EXPECT_TRUE(left == right && left <= right && left >= right);
     EXPECT_FALSE(left < right || left > right || left != right);
+}
+
+// Extremes.
+
+// All that can be done with a value, as one text; each step may raise.
+std::string everythingOf(CDateTime const& value, CDateTime const& other, unsigned int seconds) {
+    Time::CTimeZone const zone(Time::CTimeZone::etzMinus, other.getHour(), other.getMinute());
+    std::ostringstream stream;
+    stream << value;
+    return stream.str() + outcomeOf([&] { return plus(value, seconds); }) +
+           outcomeOf([&] { return minus(value, seconds); }) +
+           outcomeOf([&] { return std::to_string(value - other); }) +
+           outcomeOf([&] { return std::to_string(value.getDayOfWeek()); }) +
+           TimeTest::narrow(value.getAsISOdate(zone)) + value.getAsPDFdate(zone) +
+           std::to_string(zone.getSeconds()) +
+           TimeTest::narrow(value.format(L"DD M YYYY YY hh mm ss cc tt"));
+}
+
+TEST_F(CTimeDateTimeTest, NothingMindsExtremeFields) {
+    constexpr unsigned seed = 20380119;
+    std::printf("seed %u\n", seed);
+    std::mt19937 random(seed);
+    int const fields[] = {lowest, lowest + 1, -1900, -1, 0, 1, 12, 59, 2021, highest - 1, highest};
+    unsigned int const seconds[] = {0, 1, 86400, 0x7FFFFFFF, 0x80000000, most};
+    auto const any = [&] { return fields[random() % std::size(fields)]; };
+    auto const anyMoment = [&] {
+        CTime const time(any(), any(), any(), any());
+        return CDateTime(time, TimeTest::uncheckedDate(any(), any(), any()));
+    };
+    for (int i = 0; i < 2000; ++i) {
+        CDateTime const left = anyMoment();
+        CDateTime const right = anyMoment();
+        everythingOf(left, right, seconds[random() % std::size(seconds)]);
+        ASSERT_EQ((left < right) + (left > right) + (left == right), 1)
+            << show(left) << " and " << show(right);
+    }
+}
+
+TEST_F(CTimeDateTimeTest, ExtremeFieldsHaveATextOfTheLocale) {
+    TestSupport::CZone const zone("America/New_York");
+    for (int const year : {lowest, -5000000, 0, 10000, 5000000, highest})
+        for (int const rest : {lowest, 0, highest}) {
+            CDateTime const value(CTime(rest, rest, rest, rest),
+                                  TimeTest::uncheckedDate(rest, rest, year));
+            EXPECT_GT(value.format(CDateTime::efFull, CDateTime::efFull, L"").size(), 8U) << year;
+        }
 }
 
 // Streams.

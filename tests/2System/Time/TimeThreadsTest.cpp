@@ -32,7 +32,8 @@ std::string writtenAndRead(CDateTime const& moment) {
     stream << moment;
     return show(TimeTest::readISO(TimeTest::narrow(moment.getAsISOdate(zone)), true)) + ' ' +
            show(TimeTest::readPDF(moment.getAsPDFdate(), true)) + ' ' +
-           show(CDateTime::readDateTime(stream)) + ' ' + show(moment.format(L"D.M.YYYY hh:mm:ss"));
+           show(CDateTime::readDateTime(stream)) + ' ' + show(moment.format(L"D.M.YYYY hh:mm:ss")) +
+           ' ' + show(moment.format(CDateTime::efFull, CDateTime::efLong, L", "));
 }
 
 std::string failures(int number) {
