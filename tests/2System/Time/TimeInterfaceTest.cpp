@@ -8,8 +8,9 @@
 
 #include <cstdint>
 #include <ctime>
-#include <iosfwd>
+#include <istream>
 #include <type_traits>
+#include <utility>
 
 namespace {
 
@@ -119,6 +120,19 @@ static_assert(isOverload<std::wostream& (*)(std::wostream&, CTime const&)>(Time:
 static_assert(CTimeZone::etzNone == -2 && CTimeZone::etzMinus == -1 && CTimeZone::etzUTC == 0 &&
               CTimeZone::etzPlus == 1);
 static_assert(isOverload<int (CTimeZone::*)() const>(&CTimeZone::getSeconds));
+
+// Reading goes by the static members: a stream's state alone does not say what was wrong.
+template <class TStream, class TValue, class = void>
+constexpr bool isExtractable = false;
+template <class TStream, class TValue>
+constexpr bool isExtractable<
+    TStream, TValue, std::void_t<decltype(std::declval<TStream&>() >> std::declval<TValue&>())>> =
+    true;
+static_assert(isExtractable<std::istream, int>);
+static_assert(!isExtractable<std::istream, CDate> && !isExtractable<std::wistream, CDate>);
+static_assert(!isExtractable<std::istream, CTime> && !isExtractable<std::wistream, CTime>);
+static_assert(!isExtractable<std::istream, Time::CDateTime> &&
+              !isExtractable<std::wistream, Time::CDateTime>);
 
 // The order of the parents is part of the type.
 template <template <class> class TName, class... TParents>
