@@ -112,7 +112,8 @@ class CDate {
 
     /// Reads `day.month.year`, `year-month-day` or `month/day/year`; the delimiter decides. The
     /// month may be a word as above, with white space behind it and no second delimiter. Raises
-    /// TExcTimeDateTime, with the stream left where it failed.
+    /// TExcTimeDateTime, with the stream left where it failed; a refused word of bytes that are no
+    /// UTF-8 can't be quoted and raises TExcEncoding.
     static CDate readDate(std::istream& stream);
     static CDate readDate(std::wistream& stream);
 
