@@ -184,6 +184,33 @@ TEST_F(CCopyFileTest, AFifoIsRefusedUnopened) {
     EXPECT_EQ(calls.count("open"), 0U);
 }
 
+TEST_F(CCopyFileTest, AFifoInTheTargetsPlaceIsRefusedUnopened) {
+    ASSERT_EQ(mkfifo(path("fifo").c_str(), 0600), 0);
+    CSystemCalls calls;
+    expectRefused("from", "fifo", true, ENOSYS);
+    EXPECT_EQ(calls.count("open"), 0U);
+    copy("from", "fifo", false);
+    EXPECT_EQ(listTree(path()), (TNames{"fifo", "from"}));
+}
+
+TEST_F(CCopyFileTest, ADeviceInTheTargetsPlaceIsAFailure) {
+    EXPECT_EQ(failureOf([&] { FileSys::copyFile(path("from"), L"/dev/null", true); }).parameters,
+              couldNot(L"copy", L"file", wide(path("from")) + L", /dev/null", errorText(ENOSYS)));
+    EXPECT_EQ(failureOf([&] { FileSys::copyFile(L"/dev/null", path("from"), true); }).parameters,
+              couldNot(L"copy", L"file", L"/dev/null, " + wide(path("from")), errorText(ENOSYS)));
+    EXPECT_EQ(readFile(path("from")), "new text");
+}
+
+// Whatever can be refused by the system itself keeps the system's reason.
+TEST_F(CCopyFileTest, ASocketIsRefusedByTheSystem) {
+    ASSERT_EQ(mknod(path("socket").c_str(), S_IFSOCK | 0600, 0), 0);
+    expectRefused("socket", "to", false, ENXIO);
+    expectRefused("socket", "from", true, ENXIO);
+    expectRefused("from", "socket", true, ENXIO);
+    EXPECT_EQ(listTree(path()), (TNames{"from", "socket"}));
+    EXPECT_EQ(readFile(path("from")), "new text");
+}
+
 TEST_F(CCopyFileTest, AFolderInTheTargetsPlaceIsAFailure) {
     makeFolders(path("to/inner"));
     expectRefused("from", "to", true, EISDIR);

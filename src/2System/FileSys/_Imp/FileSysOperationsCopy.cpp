@@ -16,23 +16,33 @@ boost::system::error_code systemError(int error) {
     return boost::system::error_code(error, boost::system::system_category());
 }
 
+// Opening a FIFO or a device can wait for its other end.
+bool canWaitOnOpening(struct stat const& status) {
+    return S_ISFIFO(status.st_mode) || S_ISCHR(status.st_mode);
+}
+
+bool isSameFile(struct stat const& left, struct stat const& right) {
+    return S_ISREG(left.st_mode) && left.st_dev == right.st_dev && left.st_ino == right.st_ino;
+}
+
 // What the path library finds out too late: it waits for the other end of a FIFO before it refuses
 // it, and empties a file that it overwrites before it sees that this is the source under another
-// name. What can't be looked at is left alone.
+// name. The errors are the library's own, and all else is left to it.
 boost::system::error_code checkCopying(std::string const& from, std::string const& to,
                                        bool overwrite) {
     struct stat source;
     struct stat target;
     if (stat(from.c_str(), &source) != 0)
         return systemError(errno);
-    if (!S_ISREG(source.st_mode))
+    if (canWaitOnOpening(source))
         return systemError(ENOSYS);
     if (!overwrite)
         return systemError(0);
     if (stat(to.c_str(), &target) != 0)
         return systemError(errno == ENOENT ? 0 : errno);
-    bool const isSame = source.st_dev == target.st_dev && source.st_ino == target.st_ino;
-    return systemError(isSame ? EEXIST : 0);
+    if (canWaitOnOpening(target))
+        return systemError(ENOSYS);
+    return systemError(isSameFile(source, target) ? EEXIST : 0);
 }
 
 boost::system::error_code copyContent(CFileSpec const& from, CFileSpec const& to, bool overwrite) {
