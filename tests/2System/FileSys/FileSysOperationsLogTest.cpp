@@ -1,5 +1,5 @@
-// What the operations log. All of it is at SevDebug, which their logger filters, so that this
-// program is built from the operations' sources with every log call let through.
+// What paths and operations log. All of it is at SevDebug, which their loggers filter, so that this
+// program is built from their sources with every log call let through.
 
 #include "2System/FileSys/FileSysOperations.h"
 #include "2System/FileSys/FileSysTempFile.h"
@@ -45,9 +45,9 @@ class CFileLogTest : public TestSupport::CFileRootTest {
 
     static void expectLine(CLogRecord const& record, std::string const& function,
                            Strings::string const& text, TParameters parameters,
-                           Strings::string const& expanded,
-                           std::string const& target = "TgtLogger") {
-        EXPECT_EQ(record.tag, "FileSys");
+                           Strings::string const& expanded, std::string const& target = "TgtLogger",
+                           std::string const& tag = "FileSys") {
+        EXPECT_EQ(record.tag, tag);
         EXPECT_EQ(record.severity, "SevDebug");
         EXPECT_EQ(record.target, target);
         EXPECT_EQ(TestSupport::functionNameOf(std::get<2>(record.place)), function);
@@ -162,6 +162,16 @@ TEST_F(CFileLogTest, ATemporaryFileInTheTemporaryFolder) {
     EXPECT_EQ(records()[1].expanded, L"doGetTempPathName: \"" + wide(root().temporary()) + L"\".");
 }
 
+// The temporary folder by its own name is the last that is asked.
+TEST_F(CFileLogTest, WhetherAPathIsTemporary) {
+    for (std::string const& folder : {root().temporary(), "/private" + root().temporary()})
+        EXPECT_TRUE(CFileSpec(folder + "/file").isTemporary());
+    EXPECT_FALSE(CFileSpec().isTemporary());
+    EXPECT_TRUE(records().empty());
+    EXPECT_FALSE(CFileSpec(L"/elsewhere").isTemporary());
+    EXPECT_EQ(line().expanded, L"doGetTempPathName: \"" + wide(root().temporary()) + L"\".");
+}
+
 // Placeholder and parameter differ in their names.
 TEST_F(CFileLogTest, ATemporaryFolderIsNotNamed) {
     Strings::string const folder = FileSys::createTempFolder(path("name")).getFullName(false);
@@ -177,6 +187,45 @@ TEST_F(CFileLogTest, ATemporaryFileThatFailsIsStillAnnounced) {
     EXPECT_EQ(line().expanded, L"creating tmp file \"" + wide(path()) + L"\".");
     EXPECT_THROW(FileSys::createTempFolder(path("name")), FileSys::TExcFileSysOp);
     EXPECT_EQ(records().size(), 1U);
+}
+
+// The lines of a path that is made absolute: each is its text alone, with the path beside it.
+class CAbsolutePathLogTest : public CFileLogTest {
+  protected:
+    static void expectPath(CLogRecord const& record, Strings::string const& text,
+                           std::string const& name, Strings::string const& path) {
+        expectLine(record, "convertRelativeToAbsolutePath", text, {{name, path}}, text, "TgtLogger",
+                   "FileInfo");
+    }
+
+    void expectArguments(Strings::string const& abs, Strings::string const& rel) const {
+        ASSERT_GE(records().size(), 2U);
+        expectPath(records()[0], L"convertRelativeToAbsolutePath fsAbs", "fsAbs", abs);
+        expectPath(records()[1], L"convertRelativeToAbsolutePath fsRel", "fsRel", rel);
+    }
+
+    static void join(Strings::string const& abs, Strings::string const& rel) {
+        CFileSpec::convertRelativeToAbsolutePath(CFileSpec(abs), CFileSpec(rel));
+    }
+};
+
+TEST_F(CAbsolutePathLogTest, BothArgumentsAndTheResult) {
+    join(L"/a//b/", L"./../c");
+    ASSERT_EQ(records().size(), 3U);
+    expectArguments(L"/a//b/", L"./../c");
+    expectPath(records()[2], L"convertRelativeToAbsolutePath", "fs", L"/a/c");
+}
+
+TEST_F(CAbsolutePathLogTest, AnAbsolutePathIsNoResultToSpeakOf) {
+    join(L"/a", L"/x");
+    EXPECT_EQ(records().size(), 2U);
+    expectArguments(L"/a", L"/x");
+}
+
+TEST_F(CAbsolutePathLogTest, AFailureLeavesTheArguments) {
+    EXPECT_THROW(join(L"a", L"../.."), FileSys::TExcFileSpec);
+    EXPECT_EQ(records().size(), 2U);
+    expectArguments(L"a", L"../..");
 }
 
 } // namespace
