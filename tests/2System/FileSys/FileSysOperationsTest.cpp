@@ -10,6 +10,7 @@
 #include <gtest/gtest.h>
 
 #include <sys/stat.h>
+#include <sys/xattr.h>
 #include <unistd.h>
 
 #include <cerrno>
@@ -296,6 +297,30 @@ TEST_F(CFileAttributesTest, HidingHasNoSayInThePermissions) {
     FileSys::setFileAttributes(path("file"), true, true);
     EXPECT_EQ(modeOf(path("file")), 0404U);
     EXPECT_EQ(listTree(path()), TNames{"file"});
+}
+
+bool isHidden(std::string const& path) {
+    return getxattr(path.c_str(), "user.hidden", nullptr, 0) > 0;
+}
+
+// The flag can be changed as long as the file can be written, and it comes before the permission.
+TEST_F(CFileAttributesTest, TheFlagComesFirstAndItsRefusalIsNoFailure) {
+    if (setxattr(path("file").c_str(), "user.qorn-probe", "1", 1, 0) != 0)
+        GTEST_SKIP() << "the file system holds no extended attributes";
+    runAsOrdinaryUser([&] {
+        std::string const own = path("own");
+        writeFile(own);
+        FileSys::setFileAttributes(own, false, false);
+        EXPECT_FALSE(isHidden(own));
+        FileSys::setFileAttributes(own, true, true);
+        EXPECT_TRUE(isHidden(own));
+        EXPECT_EQ(modeOf(own) & 0200U, 0U);
+        FileSys::setFileAttributes(own, false, false);
+        EXPECT_TRUE(isHidden(own)) << "it could not be written yet";
+        EXPECT_EQ(modeOf(own) & 0200U, 0200U);
+        FileSys::setFileAttributes(own, false, false);
+        EXPECT_FALSE(isHidden(own));
+    });
 }
 
 TEST_F(CFileAttributesTest, AMissingFileFailsByItsPermissions) {
