@@ -369,6 +369,15 @@ TEST_F(CCanOpenTest, AFileThatTheAttemptMadeGoesAgain) {
     }
 }
 
+// The attempt makes what the link leads to; what is removed is what was asked about.
+TEST_F(CCanOpenTest, ALinkThatLedNowhereGoesAndItsTargetStays) {
+    TestSupport::makeLink("target", path("link"));
+    EXPECT_FALSE(FileSys::canOpen(path("link"), modeBits(in)));
+    EXPECT_EQ(listTree(path()), TNames{"link"});
+    EXPECT_TRUE(FileSys::canOpen(path("link"), modeBits(out)));
+    EXPECT_EQ(listTree(path()), TNames{"target"});
+}
+
 TEST_F(CCanOpenTest, WhatCannotBeOpenedIsFalse) {
     EXPECT_FALSE(FileSys::canOpen(path("missing"), modeBits(in)));
     EXPECT_FALSE(FileSys::canOpen(path("missing"), modeBits(in | out)));
