@@ -95,4 +95,16 @@ TEST_F(FileSysMemoryTest, AGuardedBlockFurtherOutAddsItselfToTheTrace) {
     EXPECT_NE(raised.trace[0].find("CFileSpec::getFileName("), std::string::npos);
 }
 
+// The copy comes before the old record goes.
+TEST_F(FileSysMemoryTest, AFailedAssignmentLeavesTheOldRecord) {
+    FileSys::CFileInfo target(L"");
+    FileSys::CFileInfo const source(L"/");
+    largestBlock = 16;
+    EXPECT_THROW(target = source, std::bad_alloc);
+    largestBlock = 0;
+    EXPECT_FALSE(target.exists());
+    target = source;
+    EXPECT_TRUE(target.exists());
+}
+
 } // namespace
