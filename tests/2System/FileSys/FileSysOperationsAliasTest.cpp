@@ -94,6 +94,16 @@ TEST_F(CAliasTest, WhatIsNoAliasLeadsNowhere) {
     EXPECT_TRUE(result.empty());
 }
 
+TEST_F(CAliasTest, WhatHasNoTextLeadsNowhere) {
+    create("alias", "source \u00E9");
+    ASSERT_EQ(std::rename(path("source \u00E9").c_str(), path("source \xE9").c_str()), 0);
+    EXPECT_EQ(resolved("alias"), "");
+    CFileSpec result(L"before");
+    CFileSpec const nameless(std::wstring(1, static_cast<wchar_t>(0xD800)));
+    EXPECT_FALSE(FileSys::resolveAlias(nameless, result));
+    EXPECT_TRUE(result.empty());
+}
+
 TEST_F(CAliasTest, AnAliasCanTakeItsOwnResult) {
     create("alias", "source \u00E9");
     CFileSpec spec(path("alias"));

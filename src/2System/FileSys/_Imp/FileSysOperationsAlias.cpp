@@ -1,4 +1,5 @@
 #include "1Base/BaseMacOS/BaseMacOS.h"
+#include "1Base/Encoding/EncodingExc.h"
 #include "2System/FileSys/FileSysOperations.h"
 #include "2System/FileSys/_Imp/FileSysOperationsImp.h"
 
@@ -18,13 +19,18 @@ void doCreateAliasFile(CFileSpec const& alias, CFileSpec const& source) {
     ERROR_BLOCK_END
 }
 
+// What has no text leads nowhere, as what is no alias: who follows one wants no failure.
 bool doResolveAlias(Strings::string const& alias, CFileSpec& result) {
     ERROR_BLOCK_BEGIN
     Strings::string path;
-    bool const resolved = MacOS::resolveBookmarkFile(alias, path);
-    if (resolved)
-        result = path;
-    return resolved;
+    try {
+        if (!MacOS::resolveBookmarkFile(alias, path))
+            return false;
+    } catch (Encoding::TExcEncoding const&) {
+        return false;
+    }
+    result = path;
+    return true;
     ERROR_BLOCK_END
 }
 
