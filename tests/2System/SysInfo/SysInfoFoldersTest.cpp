@@ -2,6 +2,7 @@
 
 #include "2System/SysInfo/SysInfoFolders.h"
 
+#include "1Base/BaseMacOS/BaseMacOS.h"
 #include "2System/FileSys/FileSysTempFile.h"
 #include "support/FileFailures.h"
 #include "support/FileRoot.h"
@@ -15,7 +16,23 @@
 #include <cstdlib>
 #include <string>
 #include <type_traits>
+#include <utility>
 #include <vector>
+
+// What was asked of MacOS::getSpecialFolder, by its numbers.
+static std::vector<std::pair<int, int>> asked;
+
+Strings::string
+realFolder(MacOS::TSystemFolderType type, MacOS::TSystemFolderDomain domain) __asm__(
+    "__real__ZN5MacOS16getSpecialFolderB5cxx11ENS_17TSystemFolderTypeENS_19TSystemFolderDomainE");
+Strings::string
+wrapFolder(MacOS::TSystemFolderType type, MacOS::TSystemFolderDomain domain) __asm__(
+    "__wrap__ZN5MacOS16getSpecialFolderB5cxx11ENS_17TSystemFolderTypeENS_19TSystemFolderDomainE");
+
+Strings::string wrapFolder(MacOS::TSystemFolderType type, MacOS::TSystemFolderDomain domain) {
+    asked.emplace_back(type, domain);
+    return realFolder(type, domain);
+}
 
 namespace {
 
@@ -56,6 +73,36 @@ class CSysInfoFoldersTest : public TestSupport::CFileRootTest {
         root().environment().set(name, value);
     }
 };
+
+// Several of them are one folder on this system, and differ on others.
+TEST_F(CSysInfoFoldersTest, EachAsksForItsKindAndDomain) {
+    root().environment().unset("TMPDIR");
+    std::pair<TFolder*, std::pair<int, int>> const rows[] = {
+        {SysInfo::getUserDocumentFolder, {1, 1}},
+        {SysInfo::getSharedUserDataFolder, {2, 0}},
+        {SysInfo::getUserDesktopFolder, {3, 1}},
+        {SysInfo::getUserLibraryFolder, {4, 1}},
+        {SysInfo::getSystemLibraryFolder, {4, 0}},
+        {SysInfo::getProgramsFolder, {5, 0}},
+        {SysInfo::getSystemFontFolder, {6, 2}},
+        {SysInfo::getAllUsersFontFolder, {6, 0}},
+        {SysInfo::getUserFontFolder, {6, 1}},
+        {SysInfo::getSystemTemporaryItemsFolder_, {7, 0}},
+        {SysInfo::getSystemTemporaryItemsFolder, {7, 0}},
+        {SysInfo::getUserTemporaryItemsFolder, {7, 0}},
+        {SysInfo::getSystemApplicationSupportFolder, {8, 0}},
+        {SysInfo::getUserApplicationSupportFolder, {8, 1}}};
+    std::vector<std::pair<int, int>> expected;
+    asked.clear();
+    for (auto const& [function, kindAndDomain] : rows) {
+        function();
+        expected.push_back(kindAndDomain);
+    }
+    SysInfo::getUserPreferenceFolder();
+    SysInfo::getSystemPreferenceFolder();
+    expected.insert(expected.end(), {{0, 1}, {0, 0}});
+    EXPECT_EQ(asked, expected);
+}
 
 TEST_F(CSysInfoFoldersTest, DocumentsAndDesktopLieInTheUsersHome) {
     EXPECT_EQ(SysInfo::getUserDocumentFolder(), wide(root().home()) + L"/Documents");
