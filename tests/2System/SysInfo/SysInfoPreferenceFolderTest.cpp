@@ -8,13 +8,16 @@
 #include "support/LogRecorder.h"
 #include "support/MessageParameters.h"
 #include "support/Place.h"
+#include "support/SystemCalls.h"
 #include "support/TextFailures.h"
 
 #include <sys/stat.h>
 #include <sys/xattr.h>
 #include <unistd.h>
 
+#include <filesystem>
 #include <functional>
+#include <system_error>
 
 using Strings::string;
 
@@ -218,6 +221,35 @@ TEST_F(CPlainPreferenceTest, TheFileIsHiddenBeforeItIsOpenedToAll) {
     store.setValue(at(""), "key", bytes("value"));
     EXPECT_EQ(calls, 1);
     EXPECT_EQ(permissionsOf(user("/key")), 0666U);
+}
+
+// Whether this process has the file open.
+bool isOpen(std::string const& file) {
+    std::error_code gone;
+    for (auto const& entry : std::filesystem::directory_iterator("/proc/self/fd"))
+        if (std::filesystem::read_symlink(entry, gone) == file)
+            return true;
+    return false;
+}
+
+// Readers that wait for the close find the value as it is to stay.
+TEST_F(CPlainPreferenceTest, TheFileIsHiddenAndOpenedToAllBeforeItIsClosed) {
+    CPreferenceFolder store = userStore();
+    TNames steps;
+    onSetHidden = [&](string const&, bool) {
+        steps.push_back(isOpen(user("/key")) ? "hidden" : "hidden when closed");
+        return true;
+    };
+    {
+        TestSupport::CSystemCalls calls;
+        calls.observe([&](std::string const& function, std::string const& file) {
+            if (function == "chmod" && file == user("/key"))
+                steps.push_back(isOpen(file) ? "opened to all" : "opened to all when closed");
+        });
+        store.setValue(at(""), "key", bytes("value"));
+    }
+    EXPECT_EQ(steps, (TNames{"hidden", "opened to all"}));
+    EXPECT_FALSE(isOpen(user("/key")));
 }
 
 TEST_F(CPlainPreferenceTest, AFileThatCannotBeHiddenRaises) {
