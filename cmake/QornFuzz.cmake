@@ -1,7 +1,7 @@
 # qorn_add_fuzzer(<name> SOURCES ... LIBRARIES ...)
 #
 # A fuzz target: a source with LLVMFuzzerTestOneInput. With QORN_BUILD_FUZZERS it becomes a libFuzzer
-# program in <build>/fuzz, to be run as
+# program in <build>/fuzz, which scripts/fuzz runs; by hand it is
 #
 #     build/fuzz/fuzz/<name> -max_total_time=180 fuzz/corpus/<name>
 #
