@@ -23,6 +23,11 @@ if(QORN_SANITIZE)
     -fsanitize=${QORN_SANITIZE} -fno-sanitize-recover=all -fno-omit-frame-pointer)
   target_link_options(qorn_build_options INTERFACE -fsanitize=${QORN_SANITIZE})
 endif()
+if(QORN_COVERAGE)
+  set(instrumentation -fprofile-instr-generate -fcoverage-mapping)
+  target_compile_options(qorn_build_options INTERFACE ${instrumentation})
+  target_link_options(qorn_build_options INTERFACE ${instrumentation})
+endif()
 
 # qorn_add_floor(<name>): the static library qorn_<name> with the alias qorn::<name>.
 function(qorn_add_floor name)
