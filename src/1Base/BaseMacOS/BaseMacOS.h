@@ -37,6 +37,7 @@ Strings::string addingPercentEscapes(Strings::string const& text);
 /// The login name, or the full name.
 Strings::string getUserName(bool login);
 
+/// The name that the machine was given for people to read, otherwise its host name.
 Strings::string getMachineName();
 
 /// The machine's model as its maker names it, or empty.
@@ -45,6 +46,7 @@ Strings::string getModelIdentifier();
 /// The user's first e-mail address, or empty.
 Strings::string getUserEmailAddress();
 
+/// Whether the user's locale measures in metres.
 bool usesMetricSystem();
 
 /// Sets or clears a file's hidden flag; a link is a file of its own. A file system that can't hold
@@ -63,12 +65,14 @@ bool resolveBookmarkFile(Strings::string const& bookmark, Strings::string& resul
 /// in a separator. Fails the check "[a count] > 0" where the system knows no such folder.
 Strings::string getSpecialFolder(TSystemFolderType type, TSystemFolderDomain domain);
 
+/// @{
 /// The modifier keys at this moment; either side's key counts.
 bool isShiftPressed();
 bool isControlPressed();
 bool isOptionPressed();
 bool isCmdPressed();
 bool isAlphaLockPressed();
+/// @}
 
 } // namespace MacOS
 
