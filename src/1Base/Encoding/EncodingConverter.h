@@ -1,6 +1,7 @@
 /// The one way from one string kind to another.
 ///
 ///     std::string const utf8 = Encoding::convert<std::string>(Strings::string(L"caf\u00E9"));
+
 ///     // utf8 == "caf\xC3\xA9"
 ///
 /// Input is read strictly: malformed UTF-8, and a UTF-32 element that is no code point, raise.
@@ -23,6 +24,7 @@ namespace Encoding {
 template <class TTarget, class TSource>
 class CConverter {
   public:
+    /// Fails as an assertion: there is no road from TSource to TTarget.
     static TTarget convert(TSource const&) { Detail::reportRecursion(); }
 };
 
@@ -30,30 +32,39 @@ class CConverter {
 template <class TString>
 class CConverter<TString, TString> {
   public:
+    /// The argument itself.
     static TString const& convert(TString const& source) { return source; }
 };
 
+/// UTF-8 into UTF-16.
 template <>
 class CConverter<Strings::stringUTF16, std::string> {
   public:
+    /// Converts; raises the conversion failure for a malformed source.
     static Strings::stringUTF16 convert(std::string const& source);
 };
 
+/// UTF-16 into UTF-8. An unpaired surrogate raises.
 template <>
 class CConverter<std::string, Strings::stringUTF16> {
   public:
+    /// Converts; raises the conversion failure for a malformed source.
     static std::string convert(Strings::stringUTF16 const& source);
 };
 
+/// UTF-32 into UTF-16.
 template <>
 class CConverter<Strings::stringUTF16, Strings::string> {
   public:
+    /// Converts; raises the conversion failure for a malformed source.
     static Strings::stringUTF16 convert(Strings::string const& source);
 };
 
+/// UTF-16 into UTF-32.
 template <>
 class CConverter<Strings::string, Strings::stringUTF16> {
   public:
+    /// Converts; raises the conversion failure for a malformed source.
     static Strings::string convert(Strings::stringUTF16 const& source);
 };
 
@@ -62,26 +73,33 @@ class CConverter<Strings::string, Strings::stringUTF16> {
 template <>
 class CConverter<Strings::stringUTF16, std::basic_string<unsigned char>> {
   public:
+    /// Converts; raises the conversion failure for a malformed source.
     static Strings::stringUTF16 convert(std::basic_string<unsigned char> const& source,
                                         ESysEncoding encoding = eseISO8859_1);
 };
 
+/// UTF-16 into bytes in a named encoding; what it lacks is written as "?".
 template <>
 class CConverter<std::basic_string<unsigned char>, Strings::stringUTF16> {
   public:
+    /// Converts; raises the conversion failure for a malformed source.
     static std::basic_string<unsigned char> convert(Strings::stringUTF16 const& source,
                                                     ESysEncoding encoding = eseISO8859_1);
 };
 
+/// UTF-32 into UTF-8.
 template <>
 class CConverter<std::string, Strings::string> {
   public:
+    /// Converts; raises the conversion failure for a malformed source.
     static std::string convert(Strings::string const& source);
 };
 
+/// UTF-8 into UTF-32.
 template <>
 class CConverter<Strings::string, std::string> {
   public:
+    /// Converts; raises the conversion failure for a malformed source.
     static Strings::string convert(std::string const& source);
 };
 
@@ -89,6 +107,7 @@ class CConverter<Strings::string, std::string> {
 template <>
 class CConverter<std::basic_string<unsigned char>, Strings::string> {
   public:
+    /// Converts; raises the conversion failure for a malformed source.
     static std::basic_string<unsigned char> convert(Strings::string const& source);
 };
 
@@ -96,14 +115,17 @@ class CConverter<std::basic_string<unsigned char>, Strings::string> {
 template <class TTarget>
 class CConverter<TTarget, char const*> {
   public:
+    /// Converts; raises the conversion failure for a malformed source.
     static TTarget convert(char const* source) {
         return CConverter<TTarget, std::string>::convert(source);
     }
 };
 
+/// The same for a wide text.
 template <class TTarget>
 class CConverter<TTarget, wchar_t const*> {
   public:
+    /// Converts; raises the conversion failure for a malformed source.
     static TTarget convert(wchar_t const* source) {
         return CConverter<TTarget, Strings::string>::convert(source);
     }

@@ -7,6 +7,7 @@
 #ifndef QORN_1BASE_ENCODINGLIST_H
 #define QORN_1BASE_ENCODINGLIST_H
 
+/// Calls X for each encoding, with its name and the value that the platform has for it.
 #define QORN_ENCODING_LIST(X)                                                                      \
     X(Current, CFStringGetSystemEncoding())                                                        \
     X(MacRoman, kCFStringEncodingMacRoman)                                                         \
