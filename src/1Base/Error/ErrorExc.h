@@ -2,9 +2,12 @@
 ///
 ///     namespace Demo {
 ///     TEMPLMETA_TAG_NAME(Parser);
+
 ///     using TExcParser = Error::TExc<TemplMeta::CTag<CTag_Name_Parser<char const*>>,
 ///                                    Error::CException>;
+
 ///     }
+
 ///     ERROR_THROW(Demo::TExcParser, Error::msgNotFound, params);   // throws XExc<TExcParser>
 ///     catch (Demo::TExcParser const& exc)                          // or any level above it
 ///
@@ -32,9 +35,11 @@ class TExc : public virtual TParent1,
              public virtual TParent4,
              public virtual TParent5 {
   public:
+    /// The tag's name, a static text.
     char const* getExcName() const override { return TemplMeta::getTagName<TTag>(); }
 };
 
+/// A level with four parents.
 template <class TTag, class TParent1, class TParent2, class TParent3, class TParent4>
 class TExc<TTag, TParent1, TParent2, TParent3, TParent4, TemplMeta::CNil>
     : public virtual TParent1,
@@ -42,38 +47,51 @@ class TExc<TTag, TParent1, TParent2, TParent3, TParent4, TemplMeta::CNil>
       public virtual TParent3,
       public virtual TParent4 {
   public:
+    /// The tag's name, a static text.
     char const* getExcName() const override { return TemplMeta::getTagName<TTag>(); }
 };
 
+/// A level with three parents.
 template <class TTag, class TParent1, class TParent2, class TParent3>
 class TExc<TTag, TParent1, TParent2, TParent3, TemplMeta::CNil, TemplMeta::CNil>
     : public virtual TParent1, public virtual TParent2, public virtual TParent3 {
   public:
+    /// The tag's name, a static text.
     char const* getExcName() const override { return TemplMeta::getTagName<TTag>(); }
 };
 
+/// A level with two parents.
 template <class TTag, class TParent1, class TParent2>
 class TExc<TTag, TParent1, TParent2, TemplMeta::CNil, TemplMeta::CNil, TemplMeta::CNil>
     : public virtual TParent1, public virtual TParent2 {
   public:
+    /// The tag's name, a static text.
     char const* getExcName() const override { return TemplMeta::getTagName<TTag>(); }
 };
 
+/// A level with one parent.
 template <class TTag, class TParent1>
 class TExc<TTag, TParent1, TemplMeta::CNil, TemplMeta::CNil, TemplMeta::CNil, TemplMeta::CNil>
     : public virtual TParent1 {
   public:
+    /// The tag's name, a static text.
     char const* getExcName() const override { return TemplMeta::getTagName<TTag>(); }
 };
 
 /// The data of every exception.
 class CExcImplementation : public virtual CException {
   public:
+    /// Copies what the exception says; its trace is empty.
     explicit CExcImplementation(CInfo const& info) : info_(info) {}
 
+    /// Origin, message and severity.
     CInfo const& getInfo() const override { return info_; }
+
+    /// @{
+    /// The guarded blocks passed so far.
     CStackInfoList const& getStackInfo() const override { return stackInfo_; }
     CStackInfoList& getStackInfo() override { return stackInfo_; }
+    /// @}
 
     /// The one registry, alive before and behind every static object.
     static CExcRegistry* accessRegistry();
@@ -143,10 +161,12 @@ class XExc : public Detail::CExcImplBase<TExc, CExcImplementation> {
         : XExc(file, line, func, date, time,
                CMessage(id, Strings::CParameterList<wchar_t>(params))) {}
 
+    /// A message with further parameters behind its own.
     XExc(char const* file, unsigned int line, char const* func, char const* date, char const* time,
          CMessage const& message, Strings::CParameterList<wchar_t> const& params)
         : XExc(file, line, func, date, time, message + params) {}
 
+    /// A message as it is.
     XExc(char const* file, unsigned int line, char const* func, char const* date, char const* time,
          CMessage const& message)
         : TBase(CInfo(file, line, func, date, time, SevError, message)) {}
@@ -156,6 +176,7 @@ class XExc : public Detail::CExcImplBase<TExc, CExcImplementation> {
          CException const& inner)
         : TBase(COrigin(file, line, func, date, time), inner, Strings::CParameterList<wchar_t>()) {}
 
+    /// A throw may copy; the copy is an exception of its own to the registry.
     XExc(XExc const& other) : CException(other), TBase(other) {}
 
     XExc& operator=(XExc const&) = delete;

@@ -23,10 +23,12 @@ class CExcRegistry {
       public:
         virtual ~CObserver() = default;
 
+        /// @{
         /// `impl` is being built: an identity, and not to be followed. `info` is what it says, or
         /// what the exception that it wraps says.
         virtual void exceptionAdded(CExcImplementation const* impl, CInfo const& info) const = 0;
         virtual void exceptionRemoved(CExcImplementation const* impl) const = 0;
+        /// @}
     };
 
     virtual ~CExcRegistry() = default;
@@ -40,15 +42,19 @@ class CExcRegistry {
     /// Removes the first equal observer and logs it; an unknown one changes nothing.
     virtual void unregisterObserver(CObserver const* observer) const = 0;
 
+    /// @{
     /// For the constructors and the destructor of exceptions alone. `removeException_` says whether
     /// the exception was still known.
     virtual void addException_(CExcImplementation const* impl, CInfo const& info) = 0;
     virtual bool removeException_(CExcImplementation const* impl) = 0;
+    /// @}
 
+    /// @{
     /// The pointer in the first slot, and the one in the slot behind the last entry: contents, not
     /// positions, and read without the lock.
     virtual CExcImplementation const* begin() const = 0;
     virtual CExcImplementation const* end() const = 0;
+    /// @}
 };
 
 } // namespace Error

@@ -17,20 +17,26 @@ namespace Error {
 /// `time` are those of the build.
 class COrigin {
   public:
+    /// The texts are static: they are not copied.
     constexpr COrigin(char const* file, unsigned int line, char const* func, char const* date,
                       char const* time)
         : file_(file), line_(line), func_(func), date_(date), time_(time) {}
 
+    /// @{
+    /// What the constructor was given.
     char const* getFile() const { return file_; }
     unsigned int getLine() const { return line_; }
     char const* getFunc() const { return func_; }
     char const* getDate() const { return date_; }
     char const* getTime() const { return time_; }
+    /// @}
 
+    /// @{
     /// `file #line`, the line right-adjusted to three places; the adjustment stays on the stream.
     /// Detailed, signature, date and time follow.
     void writeTo(std::ostream& stream, bool detailed) const;
     void writeTo(std::wostream& stream, bool detailed) const;
+    /// @}
 
   private:
     char const* file_;
@@ -43,21 +49,28 @@ class COrigin {
 /// What an exception says: origin, message, severity.
 class CInfo {
   public:
+    /// The same from the parts of an origin.
     CInfo(char const* file, unsigned int line, char const* func, char const* date, char const* time,
           ESeverity severity, CMessage const& message)
         : CInfo(COrigin(file, line, func, date, time), severity, message) {}
 
+    /// Copies the message with its parameters.
     CInfo(COrigin const& origin, ESeverity severity, CMessage const& message)
         : origin_(origin), message_(message), severity_(severity) {}
 
+    /// @{
+    /// What the constructor was given.
     COrigin const& getOrigin() const { return origin_; }
     CMessage const& getMessage() const { return message_; }
     ESeverity getSeverity() const { return severity_; }
+    /// @}
 
+    /// @{
     /// `origin: [severity] "message"`. The message is expanded in place, twice; detailed, the
     /// parameters that no placeholder took are appended to it. Not for two threads at once.
     void writeTo(std::ostream& stream, bool detailed) const;
     void writeTo(std::wostream& stream, bool detailed) const;
+    /// @}
 
   private:
     COrigin origin_;
@@ -68,6 +81,7 @@ class CInfo {
 /// A guarded block that an exception passed, by its first and last line.
 class CStackInfo {
   public:
+    /// The texts are static: they are not copied.
     constexpr CStackInfo(char const* file, unsigned int lineBegin, unsigned int lineEnd,
                          char const* func, char const* date, char const* time)
         : file_(file),
@@ -77,17 +91,22 @@ class CStackInfo {
           date_(date),
           time_(time) {}
 
+    /// @{
+    /// What the constructor was given.
     char const* getFile() const { return file_; }
     unsigned int getLineBegin() const { return lineBegin_; }
     unsigned int getLineEnd() const { return lineEnd_; }
     char const* getFunc() const { return func_; }
     char const* getDate() const { return date_; }
     char const* getTime() const { return time_; }
+    /// @}
 
+    /// @{
     /// `file [#first...#last] `, with the blank at its end; detailed, signature, date and time
     /// stand before that blank.
     void writeTo(std::ostream& stream, bool detailed) const;
     void writeTo(std::wostream& stream, bool detailed) const;
+    /// @}
 
   private:
     char const* file_;
@@ -101,15 +120,23 @@ class CStackInfo {
 /// The blocks in the order in which they were passed, the innermost first.
 class CStackInfoList {
   public:
+    /// Walks from the innermost block outward.
     using const_iterator = std::vector<CStackInfo>::const_iterator;
 
+    /// Adds the next block outward.
     void add(CStackInfo const& info) { entries_.push_back(info); }
+
+    /// @{
+    /// The blocks passed so far; adding one ends the validity of both.
     const_iterator begin() const { return entries_.begin(); }
     const_iterator end() const { return entries_.end(); }
+    /// @}
 
+    /// @{
     /// All entries, one after the other.
     void writeTo(std::ostream& stream, bool detailed) const;
     void writeTo(std::wostream& stream, bool detailed) const;
+    /// @}
 
   private:
     std::vector<CStackInfo> entries_;

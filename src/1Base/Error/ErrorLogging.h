@@ -2,8 +2,10 @@
 ///
 ///     using TLoggerDemo = Error::CLogger<TTagDemo, Error::TStdSeverities, Error::TStdTargets,
 ///                                        Error::CGlobalLogger, TemplMeta::CAnd>;
+
 ///     ERROR_LOG(TLoggerDemo, Error::TTgtLogger, Error::TSevWarn, "no folder @(key)",
 ///               ERROR_PARAM(key));
+
 ///
 /// A call names a target and a severity as types. Each logger up the chain must let the pair
 /// through; what one of them filters leaves no code behind. What passes reaches the targets that
@@ -87,6 +89,7 @@ class CLogSingleton {
         dolog<TTag, TTarget, TSeverity>(list, file, line, func, date, time, text, std::move(owned));
     }
 
+    /// The targets of one pair. Read and changed under the lock alone.
     template <class TTarget, class TSeverity>
     static Detail::TLogTargetList& getTargetList_() {
         return Detail::CTargetListAccessor<TTarget, TSeverity>::doGetTargetList_();
@@ -123,6 +126,7 @@ class CLogSingleton {
 /// The end of each chain of loggers.
 class CGlobalLogger {
   public:
+    /// Hands the record to the targets of its pair.
     template <class TTag, class TTarget, class TSeverity, class TChar, class TParams>
     static void logFwd_(char const* file, unsigned int line, char const* func, char const* date,
                         char const* time, TChar const* text, TParams const& params) {
@@ -172,6 +176,9 @@ class CFilter<TTag, TTarget, TTargets, TSeverity, TSeverities, TParent, TParams,
 template <class TTag, class TSeverities, class TTargets, class TParent, class TCombine>
 class CLogger {
   public:
+    /// @{
+    /// Logs a text with its parameters, or with none, where this logger and all above it let the
+    /// pair of target and severity through; otherwise the call is empty.
     template <class TTarget, class TSeverity, class TChar, class TParams>
     static void log(char const* file, unsigned int line, char const* func, char const* date,
                     char const* time, TChar const* text, TParams const& params) {
@@ -183,6 +190,7 @@ class CLogger {
                     char const* time, TChar const* text) {
         log<TTarget, TSeverity>(file, line, func, date, time, text, TemplMeta::CNil());
     }
+    /// @}
 
     /// The same for a child, with the tag of the logger that was called first.
     template <class TOrigin, class TTarget, class TSeverity, class TChar, class TParams>

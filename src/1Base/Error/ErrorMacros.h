@@ -31,6 +31,7 @@
 /// become one of the family.
 ///     ERROR_BLOCK_BEGIN
 ///         remove(path);
+
 ///     ERROR_BLOCK_END
 /// The handler for the family saves what the catch-all would cost it, a second rethrow.
 #define ERROR_BLOCK_BEGIN                                                                          \
@@ -40,6 +41,7 @@
         ERROR_IGNORE_SHADOW_END_                                                                   \
         try {
 
+/// Ends a guarded block. Its line is the last one in the entry of the trace.
 #define ERROR_BLOCK_END                                                                            \
     }                                                                                              \
     catch (::Error::CExcImplementation & errorException_) {                                        \
@@ -74,10 +76,13 @@
 #define ERROR_LOG(TLogger, TTarget, TSeverity, ...)                                                \
     (TLogger::template log<TTarget, TSeverity>(ERROR_ORIGIN, __VA_ARGS__))
 
+/// An expression as text, its macros expanded.
 #define ERROR_TEXT_(...) #__VA_ARGS__
 
+/// Keeps compilers from warning of nested guarded blocks, whose variables have one name.
 #define ERROR_IGNORE_SHADOW_BEGIN_                                                                 \
     _Pragma("GCC diagnostic push") _Pragma("GCC diagnostic ignored \"-Wshadow\"")
+/// The end of what ERROR_IGNORE_SHADOW_BEGIN_ began.
 #define ERROR_IGNORE_SHADOW_END_ _Pragma("GCC diagnostic pop")
 
 #endif

@@ -2,6 +2,7 @@
 ///
 ///     // Of the template "@(type) @(key) was not found":
 ///     Error::CMessage const message(Error::msgNotFound, params);
+
 ///     message.getString(true);   // L"File /tmp/a was not found"
 #ifndef QORN_1BASE_ERRORMESSAGE_H
 #define QORN_1BASE_ERRORMESSAGE_H
@@ -29,6 +30,7 @@ class CMessage : public Strings::CMessage<wchar_t, Strings::CParameterList<wchar
         Strings::string load(EMsgID const& id) const;
 
       protected:
+        /// The text of `id`, with its placeholders; empty where there is none.
         virtual Strings::string doLoadMessage(EMsgID const& id) const = 0;
     };
 
@@ -66,8 +68,11 @@ Strings::string loadDefaultMessage(EMsgID const& id);
 /// looked at.
 class COSErrMessage : public CMessage {
   public:
+    /// @{
+    /// Every code has the same text.
     COSErrMessage();
     explicit COSErrMessage(short code);
+    /// @}
 };
 
 } // namespace Error

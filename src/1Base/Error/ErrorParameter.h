@@ -21,6 +21,7 @@ constexpr TemplMeta::CNil inOrder() {
     return TemplMeta::CNil();
 }
 
+/// One parameter, as it is.
 template <class T>
 constexpr Strings::CStaticNamedParameter<T>
 inOrder(Strings::CStaticNamedParameter<T> const& parameter) {

@@ -4,6 +4,7 @@
 ///         Error::CScopeTracer<TLoggerDemo, Error::TTgtLogger, Error::TSevLog> const tracer(
 ///             ERROR_ORIGIN, "convertAll");   // Entering scope 'convertAll'...
 ///         convert(text);
+
 ///     }                                      // Leaving scope 'convertAll'...
 #ifndef QORN_1BASE_ERRORSCOPETRACER_H
 #define QORN_1BASE_ERRORSCOPETRACER_H
@@ -28,6 +29,7 @@ class CScopeTracerBase {
 template <class TLogger, class TTarget, class TSeverity>
 class CScopeTracer : private Detail::CScopeTracerBase {
   public:
+    /// Logs that the scope is entered; what logging raises passes.
     CScopeTracer(char const* file, unsigned int line, char const* func, char const* date,
                  char const* time, char const* scope)
         : origin_(file, line, func, date, time), scope_(scope) {

@@ -31,17 +31,24 @@ TEMPLMETA_TAG_NAME(TgtDebugger);
 TEMPLMETA_TAG_NAME(TgtLogger);
 TEMPLMETA_TAG_NAME(TgtUser);
 
+/// @{
+/// A severity as a type: what a log site says, and what a filter is made of.
 using TSevDebug = TemplMeta::CTag<CTag_Name_SevDebug<char const*>>;
 using TSevLog = TemplMeta::CTag<CTag_Name_SevLog<char const*>>;
 using TSevInfo = TemplMeta::CTag<CTag_Name_SevInfo<char const*>>;
 using TSevWarn = TemplMeta::CTag<CTag_Name_SevWarn<char const*>>;
 using TSevError = TemplMeta::CTag<CTag_Name_SevError<char const*>>;
 using TSevFatal = TemplMeta::CTag<CTag_Name_SevFatal<char const*>>;
+/// @}
 
+/// @{
+/// Whom a record is for: who debugs, who reads the log, or the program's user.
 using TTgtDebugger = TemplMeta::CTag<CTag_Name_TgtDebugger<char const*>>;
 using TTgtLogger = TemplMeta::CTag<CTag_Name_TgtLogger<char const*>>;
 using TTgtUser = TemplMeta::CTag<CTag_Name_TgtUser<char const*>>;
+/// @}
 
+/// @{
 /// What a logger lets through as a rule: everything from SevLog up, to the logger and the user.
 using TStdSeverities = TemplMeta::CTypeList<
     TSevLog,
@@ -51,6 +58,7 @@ using TStdSeverities = TemplMeta::CTypeList<
                                     TSevError, TemplMeta::CTypeList<TSevFatal, TemplMeta::CNil>>>>>;
 using TStdTargets =
     TemplMeta::CTypeList<TTgtLogger, TemplMeta::CTypeList<TTgtUser, TemplMeta::CNil>>;
+/// @}
 
 } // namespace Error
 

@@ -11,6 +11,7 @@ TEMPLMETA_TAG_NAME(System);
 /// Never raised itself: caught, it stands for all failures of files, modules and system facts.
 using TExcSystem = Error::TExc<TemplMeta::CTag<CTag_Name_System<char const*>>, Error::CException>;
 
+/// The logger above those of files, system facts and dates.
 using TLoggerSystem =
     Error::CLogger<TemplMeta::CTag<CTag_Name_System<char const*>>, Error::TStdSeverities,
                    Error::TStdTargets, Error::CGlobalLogger, TemplMeta::CAnd>;
