@@ -1,6 +1,7 @@
 /// The lazily made instance of any default-constructible class.
 ///
 ///     CRegister& theRegister = StdUtil::CSingleton::get<CRegister>();
+
 ///
 /// `get` takes no lock: the first call for a type must not race with another one. Once it has
 /// returned, calls are safe on any thread. No instance is destroyed when the process ends, so one
@@ -28,11 +29,13 @@ class CSingletonManager {
     template <class TSingleton>
     static TSingleton& get();
 
+    /// The slot of one type, null until it is filled.
     template <class TSingleton>
     static TSingleton*& get_() {
         return TTraits::template get_<TSingleton>();
     }
 
+    /// All instances made so far, in the order of their making.
     static std::vector<Detail::CSingletonWrapperBase*>& getSingletons() {
         return TTraits::getSingletons();
     }
@@ -45,6 +48,7 @@ class CSingletonManager {
         get_<TSingleton>() = TTraits::template createInstance<TSingleton>();
     }
 
+    /// Empties the slot and deletes what was in it.
     template <class TSingleton>
     static void deInstantiate() {
         TSingleton*& slot = get_<TSingleton>();
@@ -98,6 +102,7 @@ TSingleton& CSingletonManager<TTraits>::get() {
 /// The traits in use, and the entry for callers.
 class CSingleton {
   public:
+    /// The type's instance, made at the first call.
     template <class TSingleton>
     static TSingleton& get() {
         return CSingletonManager<CSingleton>::get<TSingleton>();
@@ -113,6 +118,7 @@ class CSingleton {
     /// All instances made so far, of all types.
     static std::vector<Detail::CSingletonWrapperBase*>& getSingletons();
 
+    /// A new instance; the caller owns it.
     template <class TSingleton>
     static TSingleton* createInstance() {
         return new TSingleton;

@@ -38,8 +38,10 @@ class CStreamCaster;
 template <class TChar, class TTraits, class TAllocator, class TSource>
 class CStreamCaster<std::basic_string<TChar, TTraits, TAllocator>, TSource> {
   public:
+    /// The text.
     using TString = std::basic_string<TChar, TTraits, TAllocator>;
 
+    /// Writes the value to a stream; raises TExcStreamCast where that fails.
     static TString cast(TSource const& source) {
         if constexpr (std::is_same_v<TString, Strings::string> &&
                       Detail::isWrittenAsDecimal<TSource>) {
@@ -62,8 +64,10 @@ class CStreamCaster<std::basic_string<TChar, TTraits, TAllocator>, TSource> {
 template <class TTarget, class TChar, class TTraits, class TAllocator>
 class CStreamCaster<TTarget, std::basic_string<TChar, TTraits, TAllocator>> {
   public:
+    /// The text.
     using TString = std::basic_string<TChar, TTraits, TAllocator>;
 
+    /// Reads the number; raises TExcStreamCast where there is none.
     static TTarget cast(TString const& source) {
         TTarget target = 0;
         if constexpr (std::is_same_v<TString, Strings::string> &&
@@ -84,24 +88,31 @@ class CStreamCaster<TTarget, std::basic_string<TChar, TTraits, TAllocator>> {
 template <>
 class CStreamCaster<Strings::string, Strings::string> {
   public:
+    /// A copy.
     static Strings::string cast(Strings::string const& source) { return source; }
 };
 
+/// UTF-8.
 template <>
 class CStreamCaster<Strings::string, std::string> {
   public:
+    /// Decodes; raises the conversion failure for a malformed text.
     static Strings::string cast(std::string const& source);
 };
 
+/// Zero-terminated UTF-8.
 template <>
 class CStreamCaster<Strings::string, char const*> {
   public:
+    /// Decodes; raises the conversion failure for a malformed text.
     static Strings::string cast(char const* source);
 };
 
+/// A zero-terminated wide text.
 template <>
 class CStreamCaster<Strings::string, wchar_t const*> {
   public:
+    /// A copy.
     static Strings::string cast(wchar_t const* source);
 };
 
