@@ -1,8 +1,11 @@
 /// A stream that reads a buffer of characters where it lies.
 ///
 ///     Strings::string const text = L"42 apples";
+
 ///     Streams::basic_isbufstream<wchar_t> in(text.data(), text.size());
+
 ///     int count = 0;
+
 ///     in >> count;   // count == 42
 #ifndef QORN_1BASE_STREAMSBUFFER_H
 #define QORN_1BASE_STREAMSBUFFER_H
@@ -43,6 +46,7 @@ class basic_isbufbuf : public std::basic_streambuf<TChar, TTraits> {
         return *this;
     }
 
+    /// Forgets the buffer, which stays its owner's: there is nothing to read any more.
     basic_isbufbuf& close() {
         this->setg(nullptr, nullptr, nullptr);
         buffer_ = nullptr;
@@ -83,6 +87,7 @@ class basic_isbufbuf : public std::basic_streambuf<TChar, TTraits> {
         return pos_type(position);
     }
 
+    /// Moves to a position from the start, clamped like an offset.
     pos_type seekpos(pos_type position, std::ios_base::openmode mode) override {
         return seekoff(off_type(position), std::ios_base::beg, mode);
     }
@@ -90,6 +95,7 @@ class basic_isbufbuf : public std::basic_streambuf<TChar, TTraits> {
   private:
     TChar* buffer_ = nullptr;
     unsigned long count_ = 0;
+
     /// The empty get area while no buffer is set.
     TChar spare_ = TChar();
 };
@@ -98,6 +104,7 @@ class basic_isbufbuf : public std::basic_streambuf<TChar, TTraits> {
 template <class TChar, class TTraits = std::char_traits<TChar>>
 class basic_isbufstream : public std::basic_istream<TChar, TTraits> {
   public:
+    /// Stands on the first character.
     basic_isbufstream(TChar const* buffer, unsigned long count)
         : basic_isbufstream(std::make_unique<basic_isbufbuf<TChar, TTraits>>()) {
         // Nothing writes to the buffer.

@@ -1,7 +1,9 @@
 /// Small helpers for reading and writing by the standard streams.
 ///
 ///     std::ostringstream out;
+
 ///     unsigned char const bytes[] = {10, 255};
+
 ///     Streams::writeHex(out, std::begin(bytes), std::end(bytes), ':');   // out.str() == "0a:ff"
 #ifndef QORN_1BASE_STREAMSHELPERS_H
 #define QORN_1BASE_STREAMSHELPERS_H
@@ -15,6 +17,7 @@ namespace Streams {
 /// Puts a stream's format flags back to what they were when the object was made.
 class CSentry {
   public:
+    /// Remembers the flags; the stream must outlive the object.
     explicit CSentry(std::ios_base& stream) : stream_(stream), flags_(stream.flags()) {}
     CSentry(CSentry const&) = delete;
     CSentry& operator=(CSentry const&) = delete;
