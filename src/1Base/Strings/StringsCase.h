@@ -1,6 +1,7 @@
 /// Upper and lower case in the language of the user.
 ///
 ///     Strings::string title = L"stra\u00DFe";
+
 ///     Strings::toUpper(title);                        // title == L"STRASSE"
 ///     Strings::toLower(Strings::string(L"TITLE"));    // L"title", under LANG=tr_TR L"t\u0131tle"
 ///
@@ -15,11 +16,13 @@
 
 namespace Strings {
 
+/// @{
 /// Changes `text` in place and returns it.
 std::string& toUpper(std::string& text);
 string& toUpper(string& text);
 std::string& toLower(std::string& text);
 string& toLower(string& text);
+/// @}
 
 /// Returns the text in lower case. A variable that is not constant is changed in place instead, by
 /// the form above.

@@ -18,18 +18,22 @@
 
 namespace Strings {
 
+/// @{
 /// Compares without regard to case. An accented letter differs from the plain one.
 int stricmp(char const* a, char const* b);
 int stricmp(wchar_t const* a, wchar_t const* b);
 int stricmp(std::string const& a, std::string const& b);
 int stricmp(string const& a, string const& b);
+/// @}
 
+/// @{
 /// Compares without regard to case and accents, and orders runs of ASCII digits by their numeric
 /// value, however long; leading zeros never matter.
 int strnatcmp(char const* a, char const* b);
 int strnatcmp(wchar_t const* a, wchar_t const* b);
 int strnatcmp(std::string const& a, std::string const& b);
 int strnatcmp(string const& a, string const& b);
+/// @}
 
 } // namespace Strings
 

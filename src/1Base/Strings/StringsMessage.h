@@ -1,13 +1,17 @@
 /// Message templates with named placeholders, and their expansion.
 ///
 ///     Strings::CParameterList<wchar_t> list;
+
 ///     list.add("key", L"/tmp/a");
+
 ///     Strings::CMessage<wchar_t, Strings::CParameterList<wchar_t>> message(
 ///         std::wstring(L"@(key) was not found"), list);
+
 ///     message.getString(true);   // L"/tmp/a was not found"
 ///
 /// "@(name)" is a placeholder, "@@" an at sign, and every other "@" itself. Names may hold balanced
 /// parentheses and are compared byte by byte. A placeholder that nothing answers stays as it is;
+
 /// a value that no placeholder took can be appended. Nothing here is an error.
 #ifndef QORN_1BASE_STRINGSMESSAGE_H
 #define QORN_1BASE_STRINGSMESSAGE_H
@@ -33,7 +37,10 @@ namespace Strings {
 template <class TChar, class TParameterList>
 class CMessage {
   public:
+    /// The kind of its text and of its values.
     using TText = std::basic_string<TChar>;
+
+    /// Values by their names, in the order of adding among equal ones.
     using TMap = std::multimap<std::string, TText, std::less<std::string>>;
 
     /// The text in any string kind, without parameters.
@@ -41,24 +48,28 @@ class CMessage {
     explicit CMessage(std::basic_string<TC, TT, TA> const& text)
         : text_(Encoding::convert<TText>(text)) {}
 
+    /// The text in any string kind, with its parameters.
     template <class TC, class TT, class TA>
     CMessage(std::basic_string<TC, TT, TA> const& text, TParameterList parameters)
         : text_(Encoding::convert<TText>(text)), parameters_(std::move(parameters)) {}
 
-    CMessage(CMessage const&) = default;
-    CMessage(CMessage&&) = default;
-    CMessage& operator=(CMessage const&) = default;
-    CMessage& operator=(CMessage&&) = default;
+    CMessage(CMessage const&) = default; ///< text and parameters as they stand
+    CMessage(CMessage&&) = default;      ///< the same, and the source is left unspecified
+    CMessage& operator=(CMessage const&) = default; ///< as the copy
+    CMessage& operator=(CMessage&&) = default;      ///< as the move
 
     virtual ~CMessage() = default;
 
+    /// Adds a parameter, as CParameterList::add() does.
     template <class T>
     void add(std::string const& name, T const& value) {
         parameters_.add(name, value);
     }
 
+    /// Adds all of the list.
     void add(TParameterList const& parameters) { parameters_.add(parameters); }
 
+    /// Adds a range of entries.
     template <class TIterator,
               class TCategory = typename std::iterator_traits<TIterator>::iterator_category>
     std::enable_if_t<std::is_convertible_v<decltype(*std::declval<TIterator&>()),
@@ -67,8 +78,8 @@ class CMessage {
         parameters_.add(first, last);
     }
 
-    auto begin() const { return parameters_.begin(); }
-    auto end() const { return parameters_.end(); }
+    auto begin() const { return parameters_.begin(); } ///< the parameters in the order of adding
+    auto end() const { return parameters_.end(); }     ///< behind the last parameter
 
     /// Runs one expansion. With `addLeftovers` true the parameters that no placeholder of this run
     /// took are appended, sorted by name: ` (a: "1", b: "2")`. Raises the conversion failure for a
@@ -78,6 +89,7 @@ class CMessage {
     /// The text; with `insert` true after an expansion that adds no leftovers.
     TText const& getString(bool insert) const;
 
+    /// The same in another string kind.
     template <class TString>
     TString getString(bool insert) const {
         return Encoding::convert<TString>(getString(insert));

@@ -18,17 +18,23 @@ namespace Strings {
 template <class T>
 class CStaticNamedParameter {
   public:
+    /// A name that ends in a zero, and a value; neither may be null.
     constexpr CStaticNamedParameter(char const* name, T const* value)
         : name_(name), value_(value) {}
 
+    /// @{
+    /// What the constructor was given.
     constexpr char const* getName() const { return name_; }
     constexpr T const& getValue() const { return *value_; }
+    /// @}
 
   private:
     char const* name_;
     T const* value_;
 };
 
+/// Names a value for the length of the statement.
+///     buildNamedParameter("line", 7)
 template <class T>
 constexpr CStaticNamedParameter<T> buildNamedParameter(char const* name, T const& value) {
     return CStaticNamedParameter<T>(name, std::addressof(value));

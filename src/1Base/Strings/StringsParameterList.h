@@ -1,6 +1,7 @@
 /// Named values of a message as text.
 ///
 ///     Strings::CParameterList<wchar_t> list(Strings::buildNamedParameter("line", 7));
+
 ///     list.begin()->getValue();   // L"7"
 #ifndef QORN_1BASE_STRINGSPARAMETERLIST_H
 #define QORN_1BASE_STRINGSPARAMETERLIST_H
@@ -24,8 +25,10 @@ namespace Strings {
 template <class TChar>
 class CParameterList {
   public:
+    /// A name and its value as text, copied.
     class CEntry {
       public:
+        /// Casts the value; raises what the cast raises.
         template <class T>
         CEntry(std::string const& name, T const& value)
             : value_(StdUtil::stream_cast<std::basic_string<TChar>, T>(value)) {
@@ -33,8 +36,11 @@ class CParameterList {
             name_ = name;
         }
 
+        /// @{
+        /// Neither ever changes.
         std::string const& getName() const { return name_; }
         std::basic_string<TChar> const& getValue() const { return value_; }
+        /// @}
 
         /// What a multimap of the entries holds.
         operator std::pair<std::string const, std::basic_string<TChar>>() const {
@@ -46,6 +52,7 @@ class CParameterList {
         std::basic_string<TChar> value_;
     };
 
+    /// Walks in the order of adding; adding ends its validity.
     using const_iterator = typename std::vector<CEntry>::const_iterator;
 
     CParameterList() = default;
@@ -53,6 +60,8 @@ class CParameterList {
     /// What a statement without parameters passes.
     CParameterList(TemplMeta::CNil) {}
 
+    /// @{
+    /// The values of a statement, as text from now on.
     template <class T>
     CParameterList(CStaticNamedParameter<T> const& parameter) {
         add(parameter);
@@ -62,12 +71,22 @@ class CParameterList {
     CParameterList(TemplMeta::CObjList<THead, TTail> const& list) {
         add(list);
     }
+    /// @}
 
+    /// The number of entries.
     std::size_t size() const { return entries_.size(); }
+
+    /// @{
+    /// The entries in the order of adding.
     const_iterator begin() const { return entries_.begin(); }
     const_iterator end() const { return entries_.end(); }
+    /// @}
+
+    /// Makes room for so many entries in all.
     void reserve(std::size_t count) { entries_.reserve(count); }
 
+    /// @{
+    /// Adds one entry; nothing for CNil.
     template <class T>
     void add(std::string const& name, T const& value) {
         entries_.emplace_back(name, value);
@@ -81,6 +100,7 @@ class CParameterList {
     }
 
     void add(TemplMeta::CNil) {}
+    /// @}
 
     /// All elements in list order, with one growth at most.
     template <class THead, class TTail>
@@ -133,6 +153,7 @@ class CParameterList {
 
 extern template class CParameterList<wchar_t>;
 
+/// @{
 /// The number of parameters in any of their forms.
 template <class T>
 constexpr std::size_t parameterCount(CStaticNamedParameter<T> const&) {
@@ -152,6 +173,7 @@ template <class TChar>
 std::size_t parameterCount(CParameterList<TChar> const& list) {
     return list.size();
 }
+/// @}
 
 /// A copy of the list with the parameter behind it.
 template <class TChar, class T>
