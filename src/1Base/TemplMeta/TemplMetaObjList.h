@@ -1,6 +1,7 @@
 /// Lists of values of any mix of types, held flat on the stack and built without allocation.
 ///
 ///     auto const list = TemplMeta::CConcatObjList<int, double>::concat(1, 2.5);
+
 ///     // CObjList<int, CObjList<double, CNil>>: 1, then 2.5; listSize(list) == 2
 #ifndef QORN_1BASE_TEMPLMETAOBJLIST_H
 #define QORN_1BASE_TEMPLMETAOBJLIST_H
@@ -13,23 +14,32 @@ namespace TemplMeta {
 template <class THead, class TTail>
 class CObjList {
   public:
+    /// Copies the head and the tail.
     constexpr CObjList(THead const& head, TTail const& tail) : head_(head), tail_(tail) {}
 
+    /// @{
+    /// They live as long as the list.
     constexpr THead const& head() const { return head_; }
     constexpr TTail const& tail() const { return tail_; }
+    /// @}
 
   private:
     THead head_;
     TTail tail_;
 };
 
+/// A list of one element.
 template <class THead>
 class CObjList<THead, CNil> {
   public:
+    /// Copies the head.
     constexpr CObjList(THead const& head, CNil) : head_(head) {}
 
+    /// @{
+    /// They live as long as the list.
     constexpr THead const& head() const { return head_; }
     constexpr CNil tail() const { return CNil(); }
+    /// @}
 
   private:
     THead head_;
@@ -93,8 +103,10 @@ constexpr unsigned long listSize(TList const&) {
 /// left: that does not compile.
 template <class TLeft, class TRight>
 struct CConcatObjList {
+    /// The list that comes out.
     using TResult = typename Detail::CConcatObjList_<TLeft, TRight>::TResult;
 
+    /// Copies both into a new list, `left` in front.
     static constexpr TResult concat(TLeft const& left, TRight const& right) {
         return Detail::CConcatObjList_<TLeft, TRight>::concat(left, right);
     }

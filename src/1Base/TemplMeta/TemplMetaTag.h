@@ -2,8 +2,11 @@
 ///
 ///     namespace Time {
 ///     TEMPLMETA_TAG_NAME(TimeDate);
+
 ///     using TTagTimeDate = TemplMeta::CTag<CTag_Name_TimeDate<char const*>>;
+
 ///     }
+
 ///     TemplMeta::getTagName<Time::TTagTimeDate>()   // "TimeDate"
 #ifndef QORN_1BASE_TEMPLMETATAG_H
 #define QORN_1BASE_TEMPLMETATAG_H
@@ -17,6 +20,7 @@ struct CNil {};
 /// anonymous namespace differs from a public one of the same name.
 template <class TTagName>
 struct CTag {
+    /// The class that TEMPLMETA_TAG_NAME declared.
     using TName = TTagName;
 };
 
