@@ -1,6 +1,7 @@
 /// What the file system says of a path at one moment.
 ///
 ///     FileSys::CFileInfo info = FileSys::CFileSpec(L"/etc/hosts").getFileInfo();
+
 ///     info.getFileSize();   // bytes
 #ifndef QORN_2SYSTEM_FILESYSFILEINFO_H
 #define QORN_2SYSTEM_FILESYSFILEINFO_H
@@ -20,12 +21,19 @@ class CFileInfo {
     /// FIFO for one, leaves as boost::filesystem::filesystem_error.
     explicit CFileInfo(Strings::string const& path);
 
+    /// @{
+    /// The same snapshot once more; nothing is asked of the disk.
     CFileInfo(CFileInfo const& other);
     CFileInfo& operator=(CFileInfo const& other);
+    /// @}
+
     ~CFileInfo();
 
+    /// @{
+    /// Of the moment of the snapshot.
     bool exists() const;
     bool isFolder() const;
+    /// @}
 
     /// Always false: neither a leading dot nor the hidden flag is looked at.
     bool isHidden() const;
@@ -36,10 +44,12 @@ class CFileInfo {
     /// Bytes; 0 for a folder.
     unsigned long long getFileSize() const;
 
+    /// @{
     /// Both are the last write time in UTC, to the second; where the path does not exist, the local
     /// time of the snapshot.
     Time::CDateTime getCreationDate() const;
     Time::CDateTime getModificationDate() const;
+    /// @}
 
   private:
     struct Impl_;

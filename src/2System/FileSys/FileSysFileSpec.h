@@ -1,6 +1,7 @@
 /// The value that names a file or folder.
 ///
 ///     FileSys::CFileSpec spec(L"/home/ada/letter.odt");
+
 ///     spec.getParentFolder();   // "/home/ada"
 ///     spec.getFileName();       // "letter"
 ///     spec + L"draft";          // "/home/ada/letter.odt/draft"
@@ -25,7 +26,10 @@ class CFileInfo;
 /// is not UTF-8.
 class CFileSpec {
   public:
+    /// The empty specification.
     CFileSpec() = default;
+
+    /// A zero-terminated text, not null.
     CFileSpec(wchar_t const* path) : path_(path) {}
 
     /// A string of any kind; a narrow one is read as UTF-8.
@@ -33,22 +37,32 @@ class CFileSpec {
     CFileSpec(std::basic_string<TChar, TTraits, TAlloc> const& path)
         : path_(Encoding::convert<Strings::string>(path)) {}
 
+    /// @{
+    /// A copy of the text.
     CFileSpec(CFileSpec const&) = default;
     CFileSpec& operator=(CFileSpec const&) = default;
+    /// @}
 
+    /// @{
     /// Takes over the text; the source is left empty, which a moved-from string alone is not bound
     /// to be.
     CFileSpec(CFileSpec&& other) noexcept;
     CFileSpec& operator=(CFileSpec&& other) noexcept;
+    /// @}
 
+    /// @{
+    /// Takes a copy of the text, which is not null.
     CFileSpec& operator=(Strings::string const& path);
     CFileSpec& operator=(wchar_t const* path);
+    /// @}
 
     ~CFileSpec() = default;
 
+    /// @{
     /// Says that a text is a POSIX path. That grammar is the class's own, so nothing is parsed.
     static CFileSpec parseUnixPath(Strings::string const& path);
     static CFileSpec parseUnixPath(std::string const& path);
+    /// @}
 
     /// The text. `forSystemCall` is true where it is about to be handed to the operating system,
     /// false where it is compared, logged or shown; here both are the same text.
@@ -60,6 +74,7 @@ class CFileSpec {
         return Encoding::convert<TString>(getFullName(forSystemCall));
     }
 
+    /// Whether the text is empty.
     bool empty() const { return path_.empty(); }
 
     /// The text before the last separator; "/" where that separator is the first character, and
@@ -76,6 +91,7 @@ class CFileSpec {
     /// The text behind the last dot of the last component; a dot in a folder's name never counts.
     Strings::string getFileExtension() const;
 
+    /// What getPath() gives, as a specification.
     CFileSpec getParentFolder() const;
 
     /// True where this text begins with the whole of the other's. It is a prefix of text and knows
@@ -117,9 +133,11 @@ class CFileSpec {
     /// The process's working directory; empty where it can't be had or takes more than 1023 bytes.
     static CFileSpec getCurrentWorkingDir();
 
+    /// @{
     /// Neither raises; what can't be looked up is not there.
     bool exists() const;
     bool isFolder() const;
+    /// @}
 
     /// Bytes; 0 for a folder and on failure.
     unsigned long long getFileSize() const;
@@ -135,8 +153,11 @@ class CFileSpec {
     /// no icon or nothing to draw it with.
     bool getIcon(std::string& rgb, std::string& alpha, int& width, int& height) const;
 
+    /// @{
+    /// One character each, the same on every system.
     static wchar_t getPathSeparator() { return L'/'; }
     static wchar_t getExtensionSeparator() { return L'.'; }
+    /// @}
 
     /// The 33 characters that may not stand in a file name: codes 0 to 31, then "/".
     static Strings::string getForbiddenChars();
@@ -151,6 +172,7 @@ bool operator==(CFileSpec const& left, CFileSpec const& right);
 /// By code point over the shorter text, then the shorter first.
 bool operator<(CFileSpec const& left, CFileSpec const& right);
 
+/// A copy, joined as by operator+=().
 CFileSpec operator+(CFileSpec left, Strings::string const& right);
 
 /// A path from the file specification of a PDF (ISO 32000, 7.11.2): backslash escapes resolved, and
@@ -160,6 +182,7 @@ CFileSpec createFileSpecFromAcrobatFileSpec(std::string const& text, int a, int 
 /// Removes all but the first of equal entries, and with `removeMissing` those that do not exist.
 void cleanFileSpecList(std::list<CFileSpec>& specs, bool removeMissing);
 
+/// Writes the text.
 std::basic_ostream<wchar_t>& operator<<(std::basic_ostream<wchar_t>& stream, CFileSpec const& spec);
 
 } // namespace FileSys

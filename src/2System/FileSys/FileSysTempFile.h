@@ -1,6 +1,7 @@
 /// Temporary files and folders with unique names.
 ///
 ///     FileSys::CTempFile file(FileSys::createTempFile(FileSys::CFileSpec()));
+
 ///     // ... removed at the end of the scope
 #ifndef QORN_2SYSTEM_FILESYSTEMPFILE_H
 #define QORN_2SYSTEM_FILESYSTEMPFILE_H
@@ -28,6 +29,7 @@ CFileSpec createTempFolder(CFileSpec const& hint);
 /// Owns a file and deletes it at the end of its life.
 class CTempFile {
   public:
+    /// Takes over the file, which need not exist; an empty specification is no file.
     explicit CTempFile(CFileSpec file) : file_(std::move(file)) {}
     CTempFile(CTempFile const&) = delete;
     CTempFile& operator=(CTempFile const&) = delete;
@@ -41,6 +43,7 @@ class CTempFile {
     /// Forgets the file, which stays on the disk.
     void releaseFile();
 
+    /// The file; empty once it was deleted or released.
     CFileSpec const& getFileSpec() const { return file_; }
 
   private:
