@@ -17,9 +17,11 @@ using TExcModules = Error::TExc<TemplMeta::CTag<CTag_Name_Modules<char const*>>,
 /// Everything that deals with a dynamic library. Never raised itself.
 using TExcDyLib = Error::TExc<TemplMeta::CTag<CTag_Name_DyLib<char const*>>, TExcModules>;
 
+/// A library or bundle that cannot be found or loaded.
 using TExcDyLibNotFound =
     Error::TExc<TemplMeta::CTag<CTag_Name_DyLibNotFound<char const*>>, TExcDyLib>;
 
+/// A symbol that a loaded library lacks.
 using TExcSymbolNotFound =
     Error::TExc<TemplMeta::CTag<CTag_Name_SymbolNotFound<char const*>>, TExcDyLib>;
 
