@@ -19,9 +19,9 @@ namespace SysInfo {
 
 /// The version of the operating system.
 struct SystemInfo {
-    Config::Int32 majorVersion = 0;
-    Config::Int32 minorVersion = 0;
-    Config::Int32 patchVersion = 0;
+    Config::Int32 majorVersion = 0; ///< the 12 of 12.1.0
+    Config::Int32 minorVersion = 0; ///< the 1
+    Config::Int32 patchVersion = 0; ///< the 0; 0 too where the system tells none
 };
 
 /// A key that can be asked for. Any other value is a key that is never down.
@@ -30,9 +30,11 @@ enum PressedKeyState : Config::Int32 { pksCommand = 0 };
 /// The full name of the user, or empty.
 Strings::string GetCurrentUserName();
 
+/// @{
 /// The machine's name: asked for at each call, or once for the whole process.
 Strings::string GetMachineName_();
 Strings::string GetMachineName();
+/// @}
 
 /// The user's e-mail address, or empty.
 Strings::string GetEmailAddress();
@@ -48,18 +50,21 @@ Strings::string GetModuleName(Modules::ModuleID_t const& id);
 /// calls must not race with each other.
 Strings::string GetModuleVersion(Modules::ModuleID_t const& id);
 
+/// Whether the user's locale measures in metres.
 bool UseMetricMeasurementSystem();
 
 /// The version of the operating system. Asks the system each time and may start a process for it.
 /// Fails a check where the system's answers make no version.
 SystemInfo GetOperatingSystemInformation();
 
+/// @{
 /// The product's name and the version. The second is not cached.
 ///     GetOperatingSystemInformation_({10, 11, 6});   // "Mac OS X 10.11.6"
 /// The first is: the text for the argument of the first call is the answer to all later ones,
 /// whatever they ask for.
 Strings::string GetOperatingSystemInformation(SystemInfo const& info);
 Strings::string GetOperatingSystemInformation_(SystemInfo const& info);
+/// @}
 
 /// The text for the running system, from the same cache.
 Strings::string GetPlatformInformation();
@@ -70,9 +75,11 @@ Strings::string GetPlatformInformation(int& majorVersion, int& minorVersion);
 /// Whether the key is down at this moment.
 bool GetPressedKeyState(PressedKeyState const& key);
 
+/// @{
 /// Always false: neither is looked for.
 bool isContainerized();
 bool isVirtualized();
+/// @}
 
 } // namespace SysInfo
 

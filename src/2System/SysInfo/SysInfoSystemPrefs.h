@@ -1,6 +1,7 @@
 /// What all stores of preferences have in common.
 ///
 ///     SysInfo::CSystemPrefsPath const path("Acme/Editor");
+
 ///     path.get();   // "Acme/Editor"
 #ifndef QORN_2SYSTEM_SYSINFOSYSTEMPREFS_H
 #define QORN_2SYSTEM_SYSINFOSYSTEMPREFS_H
@@ -12,6 +13,7 @@
 
 namespace SysInfo {
 
+/// What a store is asked for by: whose it is, and what for.
 class CSystemPrefs {
   public:
     /// Whose preferences: all users' of the machine, or the user's own.
@@ -25,9 +27,13 @@ class CSystemPrefs {
 /// given: nothing is checked, ".." included. The empty one is the store itself.
 class CSystemPrefsPath {
   public:
+    /// The store itself.
     CSystemPrefsPath() = default;
+
+    /// Keeps a copy.
     explicit CSystemPrefsPath(std::string path) : path_(std::move(path)) {}
 
+    /// The path as it was given.
     std::string get() const { return path_; }
 
   private:
