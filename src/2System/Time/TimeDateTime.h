@@ -1,6 +1,7 @@
 /// A date with a time of day, and its written forms.
 ///
 ///     Time::CDateTime moment(5, Time::CDate::emMar, 2021, 8, 5, 9, 123);
+
 ///     moment.format(L"D.M.YY hh:mm");                    // "5.3.21 08:05"
 ///     moment.getAsISOdate(Time::CTimeZone());            // "2021-03-05T08:05:09"
 #ifndef QORN_2SYSTEM_TIMEDATETIME_H
@@ -27,6 +28,7 @@ class CDateTime : public CDate, public CTime {
     /// What a reader of ISO or PDF passed in its text: bits of EParts.
     using TParts = unsigned short;
 
+    /// One bit a part of the text.
     enum EParts : TParts {
         epYear = 0x0001,
         epMonth = 0x0002,
@@ -40,6 +42,7 @@ class CDateTime : public CDate, public CTime {
         epZoneMinutes = 0x0200
     };
 
+    /// Unchecked.
     CDateTime(CTime const& time, CDate const& date);
 
     /// Raises TExcTimeDateTime where the date is none.
@@ -49,21 +52,27 @@ class CDateTime : public CDate, public CTime {
     /// Unchecked.
     CDateTime(std::tm const& time);
 
+    /// @{
     /// CDate::readDate(), then CTime::readTime(): "05.03.2021 08:05".
     static CDateTime readDateTime(std::istream& stream);
     static CDateTime readDateTime(std::wistream& stream);
+    /// @}
 
+    /// @{
     /// The present moment, without milliseconds. Where the system's clock fails it is 1 January
     /// 2036, 17:19:38 UTC, and nothing is reported.
     static CDateTime getCurrentTimeUTC();
     static CDateTime getCurrentTimeLocal();
+    /// @}
 
     /// Gives the local offset of this moment as well, hours and minutes with its sign.
     static CDateTime getCurrentTimeLocal(CTimeZone& zone);
 
+    /// @{
     /// Roll the days.
     CDateTime& addSeconds(unsigned int seconds);
     CDateTime& subSeconds(unsigned int seconds);
+    /// @}
 
     /// The text of the user's locale, date and time each in its style, with the separator between
     /// them where both have one. The value is read in the zone of the process.
@@ -83,11 +92,14 @@ class CDateTime : public CDate, public CTime {
     /// ISO 8601, extended: "2021-03-05T08:05:09+01:00". A year below 1000 is padded with blanks.
     Strings::string getAsISOdate(CTimeZone const& zone) const;
 
+    /// @{
     /// ISO 32000, 7.9.4: "D:20210305080509+01'00'". Without a zone, in the local one of this
     /// moment.
     std::string getAsPDFdate() const;
     std::string getAsPDFdate(CTimeZone const& zone) const;
+    /// @}
 
+    /// @{
     /// Reads a PDF date; the "D:" may be missing, and the text may end behind any part. Without a
     /// zone in the text `zone` stays at etzNone and the value is as written; with one, `toLocal`
     /// moves it by the difference to the local offset of this moment. `parts`, which may be null,
@@ -96,12 +108,15 @@ class CDateTime : public CDate, public CTime {
     static CDateTime readDateTimeFromPDF(std::string const& text, TParts* parts);
     static CDateTime readDateTimeFromPDF(std::string const& text, CTimeZone& zone, bool toLocal,
                                          TParts* parts);
+    /// @}
 
+    /// @{
     /// Reads an ISO date, with `separator` between date and time (callers pass 'T'; 0 stands for
     /// none). A text without a zone is UTC, and is moved as one. Otherwise as above.
     static CDateTime readDateTimeFromISO(std::string const& text, char separator, TParts* parts);
     static CDateTime readDateTimeFromISO(std::string const& text, CTimeZone& zone, bool toLocal,
                                          char separator, TParts* parts);
+    /// @}
 
     /// Reads a date of one of the UN/CEFACT formats (list 2379): 2, 3, 4, 5, 101, 102, 201 to 204.
     /// Years of two digits get no century and are refused as dates. Raises TExcTimeDateTime, and
@@ -110,6 +125,7 @@ class CDateTime : public CDate, public CTime {
     static CDateTime readDateTimeFromCEFACTFormatCode(Strings::string const& text, int code);
 };
 
+/// @{
 /// By date, then by time without its milliseconds. The whole set stands here, lest one half's
 /// operator be taken for a comparison of both.
 bool operator<(CDateTime const& left, CDateTime const& right);
@@ -118,14 +134,17 @@ bool operator<=(CDateTime const& left, CDateTime const& right);
 bool operator>=(CDateTime const& left, CDateTime const& right);
 bool operator==(CDateTime const& left, CDateTime const& right);
 bool operator!=(CDateTime const& left, CDateTime const& right);
+/// @}
 
 /// Seconds, wrapping in 32 bits, days counted on the scale of dates. Raises TExcTimeDateTime where
 /// one of the dates is none.
 int operator-(CDateTime const& left, CDateTime const& right);
 
+/// @{
 /// `dd.mm.year hh:mm:ss`.
 std::ostream& operator<<(std::ostream& stream, CDateTime const& dateTime);
 std::wostream& operator<<(std::wostream& stream, CDateTime const& dateTime);
+/// @}
 
 } // namespace Time
 

@@ -20,16 +20,20 @@ using TExcTimeDate =
 using TExcTimeTime =
     Error::TExc<TemplMeta::CTag<CTag_Name_TimeTime<char const*>>, Error::CException>;
 
+/// A date or time that is none, or that the system cannot tell.
 using TExcTimeDateTime =
     Error::TExc<TemplMeta::CTag<CTag_Name_TimeDateTime<char const*>>, TExcTimeDate, TExcTimeTime>;
 
+/// A text that is no date or time of its format.
 using TExcTimeFormatError =
     Error::TExc<TemplMeta::CTag<CTag_Name_TimeFormatError<char const*>>, TExcTimeDateTime>;
 
+/// Level one.
 using TLoggerTime =
     Error::CLogger<TemplMeta::CTag<CTag_Name_Time<char const*>>, Error::TStdSeverities,
                    Error::TStdTargets, TLoggerSystem, TemplMeta::CAnd>;
 
+/// Level two, used by dates and date-times.
 using TLoggerTimeDateTime =
     Error::CLogger<TemplMeta::CTag<CTag_Name_TimeDateTime<char const*>>, Error::TStdSeverities,
                    Error::TStdTargets, TLoggerTime, TemplMeta::CAnd>;
