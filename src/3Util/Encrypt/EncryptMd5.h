@@ -13,16 +13,21 @@
 
 namespace Encrypt {
 
+/// The 16 bytes in the order of RFC 1321.
 using TMd5Digest = boost::array<unsigned char, 16>;
 
 /// Digests bytes for the length of a scope: the digest stands in the caller's array only when the
 /// creator has been destroyed. For one thread at a time.
 ///
 ///     Encrypt::TMd5Digest digest;
+
 ///     {
 ///         Encrypt::CMd5Creator creator(digest);
+
 ///         creator.process(header);
+
 ///         creator.process(body);
+
 ///     }
 class CMd5Creator {
   public:
@@ -35,14 +40,18 @@ class CMd5Creator {
     /// Writes the digest.
     ~CMd5Creator();
 
+    /// Digests the bytes behind those before; `data` may be null for a length of 0.
     void process(unsigned char const* data, unsigned long length);
 
     /// The text with its terminating zero byte, unlike the same text as a std::string: callers'
     /// formats count on it.
     void process(char const* text);
 
+    /// @{
+    /// The content, without a terminator.
     void process(TByteVector const& data);
     void process(std::string const& text);
+    /// @}
 
   private:
     TMd5Digest& digest_;

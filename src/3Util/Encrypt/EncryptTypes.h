@@ -6,6 +6,7 @@
 
 namespace Encrypt {
 
+/// Bytes without a meaning of their own.
 using TByteVector = std::vector<unsigned char>;
 
 } // namespace Encrypt
