@@ -2,6 +2,7 @@
 /// exports.
 ///
 ///     System.load("/opt/office/libQORNOpenOffice.jnilib");
+
 ///     QORN_OoLibrary.getLibraryVersion();                                          // 3
 ///     QORN_OoLibrary.initializeLibrary(home, desktop, documents, temp, work, 1);   // 0
 ///
@@ -20,6 +21,7 @@ extern "C" {
 /// Appends the five folders to the library's list and returns 0. Nothing tests whether a folder
 /// exists, and an empty string keeps its place. A surrogate without its partner becomes "?".
 /// Further calls append further five. The flag is a 32-bit integer, any value but 0 being true;
+
 /// true and false do the same.
 ///
 /// To be called on one thread at a time: once, on the thread that loads the library. Raises the
@@ -32,11 +34,13 @@ JNIEXPORT jint JNICALL Java_veltra_1qorn_QORN_1OoLibrary_initializeLibrary(
 JNIEXPORT jint JNICALL Java_veltra_1qorn_QORN_1OoLibrary_getLibraryVersion(JNIEnv* env,
                                                                            jobject receiver);
 
+/// @{
 /// Do nothing and return 0, in any order and number.
 JNIEXPORT jint JNICALL Java_veltra_1qorn_QORN_1OoLibrary_startSuppressingDialogs(JNIEnv* env,
                                                                                  jobject receiver);
 JNIEXPORT jint JNICALL Java_veltra_1qorn_QORN_1OoLibrary_stopSuppressingDialogs(JNIEnv* env,
                                                                                 jobject receiver);
+/// @}
 }
 
 #endif
