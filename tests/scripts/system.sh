@@ -36,7 +36,7 @@ debian() {
   printf '%s\n' g++ cmake ninja-build ccache libboost1.81-dev \
     libboost-filesystem1.81-dev libboost-thread1.81-dev libicu-dev libplist-dev \
     openjdk-17-jdk-headless libgtest-dev libssl-dev clang-format git python3 shellcheck tzdata \
-    dbus-daemon libsystemd-dev libxtst6 xvfb \
+    dbus-daemon doxygen libsystemd-dev libxtst6 xvfb \
     >"$work/installed"
   : >"$work/calls"
   user 0
