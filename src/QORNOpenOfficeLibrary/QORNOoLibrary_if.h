@@ -2,7 +2,6 @@
 /// exports.
 ///
 ///     System.load("/opt/office/libQORNOpenOffice.jnilib");
-
 ///     QORN_OoLibrary.getLibraryVersion();                                          // 3
 ///     QORN_OoLibrary.initializeLibrary(home, desktop, documents, temp, work, 1);   // 0
 ///
@@ -21,7 +20,6 @@ extern "C" {
 /// Appends the five folders to the library's list and returns 0. Nothing tests whether a folder
 /// exists, and an empty string keeps its place. A surrogate without its partner becomes "?".
 /// Further calls append further five. The flag is a 32-bit integer, any value but 0 being true;
-
 /// true and false do the same.
 ///
 /// To be called on one thread at a time: once, on the thread that loads the library. Raises the

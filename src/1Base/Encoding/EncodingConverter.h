@@ -1,7 +1,6 @@
 /// The one way from one string kind to another.
 ///
 ///     std::string const utf8 = Encoding::convert<std::string>(Strings::string(L"caf\u00E9"));
-
 ///     // utf8 == "caf\xC3\xA9"
 ///
 /// Input is read strictly: malformed UTF-8, and a UTF-32 element that is no code point, raise.

@@ -2,12 +2,9 @@
 ///
 ///     namespace Demo {
 ///     TEMPLMETA_TAG_NAME(Parser);
-
 ///     using TExcParser = Error::TExc<TemplMeta::CTag<CTag_Name_Parser<char const*>>,
 ///                                    Error::CException>;
-
 ///     }
-
 ///     ERROR_THROW(Demo::TExcParser, Error::msgNotFound, params);   // throws XExc<TExcParser>
 ///     catch (Demo::TExcParser const& exc)                          // or any level above it
 ///

@@ -2,10 +2,8 @@
 ///
 ///     using TLoggerDemo = Error::CLogger<TTagDemo, Error::TStdSeverities, Error::TStdTargets,
 ///                                        Error::CGlobalLogger, TemplMeta::CAnd>;
-
 ///     ERROR_LOG(TLoggerDemo, Error::TTgtLogger, Error::TSevWarn, "no folder @(key)",
 ///               ERROR_PARAM(key));
-
 ///
 /// A call names a target and a severity as types. Each logger up the chain must let the pair
 /// through; what one of them filters leaves no code behind. What passes reaches the targets that

@@ -31,7 +31,6 @@
 /// become one of the family.
 ///     ERROR_BLOCK_BEGIN
 ///         remove(path);
-
 ///     ERROR_BLOCK_END
 /// The handler for the family saves what the catch-all would cost it, a second rethrow.
 #define ERROR_BLOCK_BEGIN                                                                          \

@@ -2,7 +2,6 @@
 ///
 ///     // Of the template "@(type) @(key) was not found":
 ///     Error::CMessage const message(Error::msgNotFound, params);
-
 ///     message.getString(true);   // L"File /tmp/a was not found"
 #ifndef QORN_1BASE_ERRORMESSAGE_H
 #define QORN_1BASE_ERRORMESSAGE_H

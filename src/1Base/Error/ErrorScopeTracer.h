@@ -4,7 +4,6 @@
 ///         Error::CScopeTracer<TLoggerDemo, Error::TTgtLogger, Error::TSevLog> const tracer(
 ///             ERROR_ORIGIN, "convertAll");   // Entering scope 'convertAll'...
 ///         convert(text);
-
 ///     }                                      // Leaving scope 'convertAll'...
 #ifndef QORN_1BASE_ERRORSCOPETRACER_H
 #define QORN_1BASE_ERRORSCOPETRACER_H

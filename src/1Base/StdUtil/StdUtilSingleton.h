@@ -1,7 +1,6 @@
 /// The lazily made instance of any default-constructible class.
 ///
 ///     CRegister& theRegister = StdUtil::CSingleton::get<CRegister>();
-
 ///
 /// `get` takes no lock: the first call for a type must not race with another one. Once it has
 /// returned, calls are safe on any thread. No instance is destroyed when the process ends, so one

@@ -1,11 +1,8 @@
 /// A stream that reads a buffer of characters where it lies.
 ///
 ///     Strings::string const text = L"42 apples";
-
 ///     Streams::basic_isbufstream<wchar_t> in(text.data(), text.size());
-
 ///     int count = 0;
-
 ///     in >> count;   // count == 42
 #ifndef QORN_1BASE_STREAMSBUFFER_H
 #define QORN_1BASE_STREAMSBUFFER_H
@@ -95,7 +92,6 @@ class basic_isbufbuf : public std::basic_streambuf<TChar, TTraits> {
   private:
     TChar* buffer_ = nullptr;
     unsigned long count_ = 0;
-
     /// The empty get area while no buffer is set.
     TChar spare_ = TChar();
 };

@@ -1,9 +1,7 @@
 /// Small helpers for reading and writing by the standard streams.
 ///
 ///     std::ostringstream out;
-
 ///     unsigned char const bytes[] = {10, 255};
-
 ///     Streams::writeHex(out, std::begin(bytes), std::end(bytes), ':');   // out.str() == "0a:ff"
 #ifndef QORN_1BASE_STREAMSHELPERS_H
 #define QORN_1BASE_STREAMSHELPERS_H

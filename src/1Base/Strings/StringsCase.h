@@ -1,7 +1,6 @@
 /// Upper and lower case in the language of the user.
 ///
 ///     Strings::string title = L"stra\u00DFe";
-
 ///     Strings::toUpper(title);                        // title == L"STRASSE"
 ///     Strings::toLower(Strings::string(L"TITLE"));    // L"title", under LANG=tr_TR L"t\u0131tle"
 ///

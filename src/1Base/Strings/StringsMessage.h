@@ -1,17 +1,13 @@
 /// Message templates with named placeholders, and their expansion.
 ///
 ///     Strings::CParameterList<wchar_t> list;
-
 ///     list.add("key", L"/tmp/a");
-
 ///     Strings::CMessage<wchar_t, Strings::CParameterList<wchar_t>> message(
 ///         std::wstring(L"@(key) was not found"), list);
-
 ///     message.getString(true);   // L"/tmp/a was not found"
 ///
 /// "@(name)" is a placeholder, "@@" an at sign, and every other "@" itself. Names may hold balanced
 /// parentheses and are compared byte by byte. A placeholder that nothing answers stays as it is;
-
 /// a value that no placeholder took can be appended. Nothing here is an error.
 #ifndef QORN_1BASE_STRINGSMESSAGE_H
 #define QORN_1BASE_STRINGSMESSAGE_H

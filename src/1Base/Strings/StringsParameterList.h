@@ -1,7 +1,6 @@
 /// Named values of a message as text.
 ///
 ///     Strings::CParameterList<wchar_t> list(Strings::buildNamedParameter("line", 7));
-
 ///     list.begin()->getValue();   // L"7"
 #ifndef QORN_1BASE_STRINGSPARAMETERLIST_H
 #define QORN_1BASE_STRINGSPARAMETERLIST_H

@@ -1,7 +1,6 @@
 /// Lists of values of any mix of types, held flat on the stack and built without allocation.
 ///
 ///     auto const list = TemplMeta::CConcatObjList<int, double>::concat(1, 2.5);
-
 ///     // CObjList<int, CObjList<double, CNil>>: 1, then 2.5; listSize(list) == 2
 #ifndef QORN_1BASE_TEMPLMETAOBJLIST_H
 #define QORN_1BASE_TEMPLMETAOBJLIST_H

@@ -2,11 +2,8 @@
 ///
 ///     namespace Time {
 ///     TEMPLMETA_TAG_NAME(TimeDate);
-
 ///     using TTagTimeDate = TemplMeta::CTag<CTag_Name_TimeDate<char const*>>;
-
 ///     }
-
 ///     TemplMeta::getTagName<Time::TTagTimeDate>()   // "TimeDate"
 #ifndef QORN_1BASE_TEMPLMETATAG_H
 #define QORN_1BASE_TEMPLMETATAG_H

@@ -1,9 +1,7 @@
 /// Walking a folder or a tree in a fixed order.
 ///
 ///     using Iterator = FileSys::CDirIterator;
-
 ///     for (Iterator i(folder, L"pdf", Iterator::eRecursive, Iterator::eFiles); i != Iterator();
-
 ///     ++i)
 ///         read(*i);
 #ifndef QORN_2SYSTEM_FILESYSDIRITERATOR_H
@@ -23,7 +21,6 @@ namespace FileSys {
 ///
 /// When a folder is opened its files go, sorted, in front of all that is waiting, and its sub
 /// folders, sorted, behind it. The walk asks the disk once an entry and reads one folder at a time;
-
 /// what was found is delivered even if it has gone since. A folder that can't be listed ends where
 /// its listing failed, and nothing is reported. A name that is not UTF-8 raises TExcEncoding when
 /// it is delivered, and the walk may go on behind it; under a filter an extension that is not UTF-8

@@ -1,7 +1,6 @@
 /// What the file system says of a path at one moment.
 ///
 ///     FileSys::CFileInfo info = FileSys::CFileSpec(L"/etc/hosts").getFileInfo();
-
 ///     info.getFileSize();   // bytes
 #ifndef QORN_2SYSTEM_FILESYSFILEINFO_H
 #define QORN_2SYSTEM_FILESYSFILEINFO_H

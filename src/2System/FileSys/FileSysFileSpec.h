@@ -1,7 +1,6 @@
 /// The value that names a file or folder.
 ///
 ///     FileSys::CFileSpec spec(L"/home/ada/letter.odt");
-
 ///     spec.getParentFolder();   // "/home/ada"
 ///     spec.getFileName();       // "letter"
 ///     spec + L"draft";          // "/home/ada/letter.odt/draft"

@@ -1,7 +1,6 @@
 /// Operations that change the file system.
 ///
 ///     FileSys::copyFile(L"/home/ada/a.txt", L"/home/ada/new/b.txt", false);
-
 ///
 /// Failures raise TExcFileSpec, or the more special chain of file operations below it; the members'
 /// texts say which. Two threads that work on the same paths race as two processes would: a test

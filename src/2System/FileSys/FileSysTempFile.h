@@ -1,7 +1,6 @@
 /// Temporary files and folders with unique names.
 ///
 ///     FileSys::CTempFile file(FileSys::createTempFile(FileSys::CFileSpec()));
-
 ///     // ... removed at the end of the scope
 #ifndef QORN_2SYSTEM_FILESYSTEMPFILE_H
 #define QORN_2SYSTEM_FILESYSTEMPFILE_H

@@ -1,16 +1,11 @@
 /// A small persistent store of named byte values: a folder with a file for each.
 ///
 ///     using Prefs = SysInfo::CPreferenceFolder;
-
 ///     Prefs prefs(SysInfo::CSystemPrefs::ekUser, SysInfo::CSystemPrefs::erWrite,
 ///                 SysInfo::CSystemPrefsPath("Acme/Editor"), true, nullptr);
-
 ///     prefs.setValue(SysInfo::CSystemPrefsPath("Window"), "size", {80, 25});
-
 ///     SysInfo::TByteVector size;
-
 ///     prefs.getValue(SysInfo::CSystemPrefsPath("Window"), "size", size);   // {80, 25}
-
 ///     // the two bytes of .../Library/Preferences/Acme/Editor/Window/size
 #ifndef QORN_2SYSTEM_SYSINFOPREFERENCEFOLDER_H
 #define QORN_2SYSTEM_SYSINFOPREFERENCEFOLDER_H
@@ -77,7 +72,6 @@ class CPreferenceFolder {
     /// folder that can't be made, TExcPreferenceFolder for a file that can't be opened or hidden,
     /// TExcStdLibException for permissions that can't be changed, as those of another user's file,
     /// whose content has changed by then. Fails a check where the authorization's "/bin/mv" fails;
-
     /// the temporary file then stays.
     void setValue(CSystemPrefsPath const& path, std::string const& key, TByteVector const& value);
 

@@ -1,7 +1,6 @@
 /// What all stores of preferences have in common.
 ///
 ///     SysInfo::CSystemPrefsPath const path("Acme/Editor");
-
 ///     path.get();   // "Acme/Editor"
 #ifndef QORN_2SYSTEM_SYSINFOSYSTEMPREFS_H
 #define QORN_2SYSTEM_SYSINFOSYSTEMPREFS_H

@@ -1,7 +1,6 @@
 /// A calendar date: day, month and year.
 ///
 ///     Time::CDate date(31, Time::CDate::emDec, 2021);
-
 ///     date.addDays(1);                                   // 1 January 2022
 ///     stream << date;                                    // "01.01.2022"
 #ifndef QORN_2SYSTEM_TIMEDATE_H

@@ -1,7 +1,6 @@
 /// A date with a time of day, and its written forms.
 ///
 ///     Time::CDateTime moment(5, Time::CDate::emMar, 2021, 8, 5, 9, 123);
-
 ///     moment.format(L"D.M.YY hh:mm");                    // "5.3.21 08:05"
 ///     moment.getAsISOdate(Time::CTimeZone());            // "2021-03-05T08:05:09"
 #ifndef QORN_2SYSTEM_TIMEDATETIME_H

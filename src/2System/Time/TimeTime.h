@@ -1,7 +1,6 @@
 /// A time of day or a span, and an offset from UTC.
 ///
 ///     Time::CTime time(10, 0, 59, 0);
-
 ///     time.addSeconds(1);                                // 10:01:00
 ///     stream << time;                                    // "10:01:00"
 #ifndef QORN_2SYSTEM_TIMETIME_H
@@ -108,7 +107,6 @@ std::wostream& operator<<(std::wostream& stream, CTime const& time);
 
 /// An offset from UTC as the standard date forms write it. Who fills it decides on the signs: the
 /// readers store hours and minutes as written, never negative for `etzMinus`;
-
 /// CDateTime::getCurrentTimeLocal() stores them with the offset's sign.
 class CTimeZone {
   public:

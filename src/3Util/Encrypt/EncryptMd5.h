@@ -20,14 +20,10 @@ using TMd5Digest = boost::array<unsigned char, 16>;
 /// creator has been destroyed. For one thread at a time.
 ///
 ///     Encrypt::TMd5Digest digest;
-
 ///     {
 ///         Encrypt::CMd5Creator creator(digest);
-
 ///         creator.process(header);
-
 ///         creator.process(body);
-
 ///     }
 class CMd5Creator {
   public:

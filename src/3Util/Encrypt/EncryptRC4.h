@@ -2,7 +2,6 @@
 /// freely takes AES-GCM or ChaCha20-Poly1305 from a cryptographic library.
 ///
 ///     std::string const secret = Encrypt::rc4("Key", std::string("Plaintext"));
-
 ///     // BB F3 16 E8 D9 40 AF 0A D3; the same call on it gives "Plaintext" back
 #ifndef QORN_3UTIL_ENCRYPTRC4_H
 #define QORN_3UTIL_ENCRYPTRC4_H
