@@ -3,6 +3,10 @@
 
 include_guard(GLOBAL)
 
+# Boost's own package file; from release 3.30 on CMake warns where its module is meant.
+if(POLICY CMP0167)
+  cmake_policy(SET CMP0167 NEW)
+endif()
 # Archives, so that the product meets no other Boost in the host's process.
 set(Boost_USE_STATIC_LIBS ON)
 find_package(Boost 1.81 REQUIRED COMPONENTS filesystem thread)
@@ -11,12 +15,16 @@ if(NOT APPLE)
   find_package(Plist REQUIRED)
 endif()
 
-# JAVA_HOME may be unset although a compiler is on the path; its real place then says where.
+# JAVA_HOME may be unset although there is a compiler; its real place then says where. Homebrew keeps
+# its own off the path, where macOS has one that only tells that there is none.
 macro(qorn_find_java)
   if(NOT JAVA_HOME AND NOT DEFINED ENV{JAVA_HOME})
-    find_program(QORN_JAVAC javac)
+    if(APPLE)
+      set(QORN_JAVAC_HINTS HINTS /opt/homebrew/opt/openjdk/bin /usr/local/opt/openjdk/bin)
+    endif()
+    find_program(QORN_JAVAC javac ${QORN_JAVAC_HINTS})
     mark_as_advanced(QORN_JAVAC)
-    if(QORN_JAVAC)
+    if(QORN_JAVAC AND NOT (APPLE AND QORN_JAVAC MATCHES "/usr/bin/javac$"))
       file(REAL_PATH ${QORN_JAVAC} QORN_JAVAC_FILE)
       cmake_path(GET QORN_JAVAC_FILE PARENT_PATH JAVA_HOME)
       cmake_path(GET JAVA_HOME PARENT_PATH JAVA_HOME)

@@ -5,8 +5,12 @@
 # Not GLOBAL: each folder that uses it needs the variable.
 include_guard()
 
-# In the "C" locale a Java machine loses every path that is not ASCII.
-set(QORN_JAVA_LOCALE LC_ALL=C.UTF-8)
+# In the "C" locale a Java machine loses every path that is not ASCII. Not every macOS has C.UTF-8.
+if(APPLE)
+  set(QORN_JAVA_LOCALE LC_ALL=en_US.UTF-8)
+else()
+  set(QORN_JAVA_LOCALE LC_ALL=C.UTF-8)
+endif()
 
 function(qorn_add_java name)
   cmake_parse_arguments(PARSE_ARGV 1 arg "" "" "SOURCES")

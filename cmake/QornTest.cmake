@@ -1,15 +1,30 @@
-# qorn_add_test(<name> SOURCES ... LIBRARIES ... [WRAP ...] [LABELS ...])
+# qorn_add_test(<name> [LINUX] SOURCES ... LIBRARIES ... [WRAP ...] [LABELS ...])
 #
 # A test program of GoogleTest. Each of its tests becomes a CTest test in a process of its own, so
 # that caches and singletons start fresh. WRAP names functions of other units that the program puts
-# its own `__wrap_` versions in front of at link time (Linux).
+# its own `__wrap_` versions in front of at link time.
+#
+# LINUX marks a test of Linux: what it tests is there alone, or one of its LIBRARIES puts functions
+# in front of others as WRAP does, which the linker of macOS can't. Elsewhere it counts as skipped,
+# and so does every test with WRAP. Tests that need more than a line each stand in `if(NOT APPLE)`.
 
 include_guard(GLOBAL)
 include(GoogleTest)
 find_package(GTest REQUIRED)
 
+# qorn_add_skipped_test(<name> <reason>)
+function(qorn_add_skipped_test name reason)
+  set(mark "[  SKIPPED ]")
+  add_test(NAME ${name} COMMAND ${CMAKE_COMMAND} -E echo "${mark} ${reason}")
+  set_tests_properties(${name} PROPERTIES SKIP_REGULAR_EXPRESSION "\\[  SKIPPED \\]")
+endfunction()
+
 function(qorn_add_test name)
-  cmake_parse_arguments(PARSE_ARGV 1 arg "" "" "SOURCES;LIBRARIES;WRAP;LABELS")
+  cmake_parse_arguments(PARSE_ARGV 1 arg "LINUX" "" "SOURCES;LIBRARIES;WRAP;LABELS")
+  if(APPLE AND (arg_LINUX OR arg_WRAP))
+    qorn_add_skipped_test(${name} "a test of Linux alone")
+    return()
+  endif()
   add_executable(${name} ${arg_SOURCES})
   if(QORN_SANITIZE)
     target_sources(${name} PRIVATE ${PROJECT_SOURCE_DIR}/tests/support/SanitizerOptions.cpp)
