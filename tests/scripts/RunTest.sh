@@ -166,9 +166,11 @@ ABuildFolderOfAnotherPlaceIsConfiguredAnew() {
 }
 
 ABareEnvironmentIsEnough() {
+  local home
+  home=$(getent passwd "$(id -u)" | cut -d : -f 6)
   debian
-  stub cmake <<<'echo "home is $HOME"; exit 1'
-  expect_failure 1 "home is $(getent passwd 0 | cut -d : -f 6)" \
+  stub cmake <<<'echo "home is $HOME."; exit 1'
+  expect_failure 1 "home is $home." \
     env -i WORK="$work" PATH="$PATH" "$project/run"
 }
 

@@ -1,5 +1,5 @@
 # Sourced by the tests of the commands: a system that is made up. What is installed stands in a file,
-# and apt-get adds to it.
+# and apt-get or brew adds to it.
 # shellcheck shell=bash
 # shellcheck disable=SC2016 # the programs that stand in expand their variables themselves
 # shellcheck source=tests/scripts/support.sh
@@ -11,8 +11,8 @@ isolate_commands() {
   local tool
   cp -r -- "$root/run" "$root/test" "$root/scripts" "$project/"
   mkdir -- "$work/bin"
-  for tool in awk basename bash cat chmod cut dirname echo env false getent grep id ls mkdir mktemp \
-    mv nproc readlink rm sed sort tail tee touch true wc; do
+  for tool in awk basename bash cat chmod cut dirname echo env false getconf grep id ls mkdir mktemp \
+    mv readlink rm sed sort tail tee touch true uname wc; do
     ln -s -- "$(type -P "$tool")" "$work/bin/$tool"
   done
   PATH=$work/bin
@@ -33,11 +33,8 @@ stub() {
 debian() {
   isolate_commands
   export WORK=$work
-  printf '%s\n' g++ cmake ninja-build ccache libboost1.81-dev \
-    libboost-filesystem1.81-dev libboost-thread1.81-dev libicu-dev libplist-dev \
-    openjdk-17-jdk-headless libgtest-dev libssl-dev clang-format git python3 shellcheck tzdata \
-    dbus-daemon doxygen libsystemd-dev libxtst6 xvfb \
-    >"$work/installed"
+  # shellcheck source=scripts/packages
+  (source "$root/scripts/packages" && printf '%s\n' "${packages_test[@]}") >"$work/installed"
   : >"$work/calls"
   user 0
   stub dpkg-query <<<'sed "s/$/ installed/" "$WORK/installed"'
@@ -48,6 +45,30 @@ case " $* " in
 esac
 END
   stub javac </dev/null
+  stub cmake <<<'echo "no compiler" >&2; exit 1'
+}
+
+# A Mac, used by user 501, with all that ./run needs, where no tool is found that macOS lacks. The
+# configuration fails.
+macos() {
+  isolate_commands
+  export WORK=$work
+  printf '%s\n' cmake ninja boost openjdk ca-certificates >"$work/installed"
+  : >"$work/calls"
+  user 501
+  stub uname <<<'echo Darwin'
+  stub xcode-select <<<'echo /Library/Developer/CommandLineTools'
+  stub brew <<'END'
+case $1 in
+  list) cat "$WORK/installed" ;;
+  *)
+    echo "brew $*${HOMEBREW_NO_AUTO_UPDATE:+, no update}" >>"$WORK/calls"
+    shift 2
+    printf '%s\n' "$@" >>"$WORK/installed"
+    ;;
+esac
+END
+  stub javac <<<'echo "Unable to locate a Java Runtime." >&2; exit 1'
   stub cmake <<<'echo "no compiler" >&2; exit 1'
 }
 
