@@ -168,6 +168,8 @@ TheOldestMacCanBeChosen() {
 
 AProjectAroundItChoosesItsOwnOldestMac() {
   mac arm64 /opt/homebrew
+  # Else CMake makes an entry for the project around it.
+  add_tool /usr/bin/sw_vers 'exit 1'
   add_file CMakeLists.txt <<END
 cmake_minimum_required(VERSION 3.25)
 project(another LANGUAGES CXX)
@@ -191,7 +193,7 @@ TheStandInForJavaIsNoJava() {
   rm -- "$mac/opt/homebrew/opt/openjdk"
   # Found only where the folder above the stand-in is taken for a Java's.
   add_to_mac /usr/lib/server/libjvm.dylib </dev/null
-  expect_failure 1 "Could NOT find JNI" configure "$root"
+  expect_failure 1 "JAVA_INCLUDE_PATH2 JVM)" configure "$root"
 }
 
 AnotherJavaCanBeChosen() {
