@@ -44,8 +44,9 @@ extern "C" {
 /// no other allocator exists here.
 extern CFAllocatorRef const kCFAllocatorDefault;
 
-/// The release of the framework whose behaviour is shown (the one of macOS 10.15).
-extern double const kCFCoreFoundationVersionNumber;
+/// The release of the framework whose behaviour is shown (the one of macOS 10.15). No constant: the
+/// framework declares it so.
+extern double kCFCoreFoundationVersionNumber;
 
 /// Adds one owner and returns the object. A null object ends the process.
 CFTypeRef CFRetain(CFTypeRef object);

@@ -7,7 +7,8 @@
 
 namespace {
 
-static_assert(sizeof(KeyMap) == 16);
+static_assert(sizeof(KeyMap) == 16 && std::is_same_v<KeyMap, BigEndianUInt32[4]>);
+static_assert(std::is_same_v<decltype(BigEndianUInt32::bigEndianValue), std::uint32_t>);
 static_assert(std::is_same_v<decltype(GetKeys), void(KeyMap)>);
 
 // Seven fields of 16 bits in this order.

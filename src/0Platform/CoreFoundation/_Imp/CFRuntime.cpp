@@ -5,7 +5,7 @@
 using CFPlatform::Object;
 
 CFAllocatorRef const kCFAllocatorDefault = nullptr;
-double const kCFCoreFoundationVersionNumber = 1674.102;
+double kCFCoreFoundationVersionNumber = 1674.102;
 
 namespace {
 
