@@ -14,6 +14,9 @@
 #include <utility>
 #include <vector>
 
+// Icon services are deprecated from 10.15 on. What follows them is AppKit, for the main thread.
+#pragma GCC diagnostic ignored "-Wdeprecated-declarations"
+
 namespace FileSys {
 namespace {
 
