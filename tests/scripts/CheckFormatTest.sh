@@ -25,6 +25,16 @@ AFileThatIsNotYetAddedIsChecked() {
   expect_failure 123 "New.h:1" "$root/scripts/check-format" "$project"
 }
 
+ObjectiveCIsReadToo() {
+  commit_all
+  cp -- "$root/.clang-format" "$project/"
+  add_file src/New.h <<<'@class NSString;'
+  add_file src/New.mm <<<'NSString   *text;'
+  expect_failure 123 "New.mm:1" "$root/scripts/check-format" "$project"
+  add_file src/New.mm <<<'NSString* text;'
+  expect_success "$root/scripts/check-format" "$project"
+}
+
 AnIgnoredFileIsNot() {
   add_file .gitignore <<<'/build/'
   project_with <<<'int a;'
