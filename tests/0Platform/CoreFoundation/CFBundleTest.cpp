@@ -7,7 +7,6 @@
 #include <filesystem>
 #include <new>
 #include <thread>
-#include <type_traits>
 #include <vector>
 
 namespace fs = std::filesystem;
@@ -22,18 +21,6 @@ using TestSupport::moduleEvents;
 using TestSupport::xmlInfo;
 
 namespace {
-
-static_assert(std::is_same_v<CFBundleRef, __CFBundle*>);
-static_assert(std::is_same_v<decltype(kCFBundleNameKey), CFStringRef const>);
-static_assert(std::is_same_v<decltype(kCFBundleVersionKey), CFStringRef const>);
-static_assert(std::is_same_v<decltype(CFBundleCreate), CFBundleRef(CFAllocatorRef, CFURLRef)>);
-static_assert(std::is_same_v<decltype(CFBundleGetValueForInfoDictionaryKey),
-                             CFTypeRef(CFBundleRef, CFStringRef)>);
-static_assert(std::is_same_v<decltype(CFBundleCopyExecutableURL), CFURLRef(CFBundleRef)>);
-static_assert(std::is_same_v<decltype(CFBundleLoadExecutable), Boolean(CFBundleRef)>);
-static_assert(std::is_same_v<decltype(CFBundleUnloadExecutable), void(CFBundleRef)>);
-static_assert(
-    std::is_same_v<decltype(CFBundleGetFunctionPointerForName), void*(CFBundleRef, CFStringRef)>);
 
 using TEvents = std::vector<std::string>;
 

@@ -4,18 +4,10 @@
 #include "support/PlatformString.h"
 
 #include <string>
-#include <type_traits>
 
 using TestSupport::CPlatformString;
 
 namespace {
-
-static_assert(std::is_same_v<CFURLRef, __CFURL const*>);
-static_assert(std::is_same_v<std::underlying_type_t<CFURLPathStyle>, CFIndex>);
-static_assert(kCFURLPOSIXPathStyle == 0);
-static_assert(std::is_same_v<decltype(CFURLCreateWithFileSystemPath),
-                             CFURLRef(CFAllocatorRef, CFStringRef, CFURLPathStyle, Boolean)>);
-static_assert(std::is_same_v<decltype(CFURLCopyLastPathComponent), CFStringRef(CFURLRef)>);
 
 using CFURLTest = TestSupport::CObjectCountTest;
 
