@@ -31,10 +31,10 @@ stub() {
 # A Debian system, used by root, with all that ./run needs. The configuration fails, so that the
 # commands end there.
 debian() {
+  bash -c 'root=$1 && source "$root/scripts/packages" && printf "%s\n" "${packages_test[@]}"' - \
+    "$root" >"$work/installed"
   isolate_commands
   export WORK=$work
-  # shellcheck source=scripts/packages
-  (source "$root/scripts/packages" && printf '%s\n' "${packages_test[@]}") >"$work/installed"
   : >"$work/calls"
   user 0
   stub dpkg-query <<<'sed "s/$/ installed/" "$WORK/installed"'
