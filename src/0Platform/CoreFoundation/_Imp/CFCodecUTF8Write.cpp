@@ -92,7 +92,7 @@ class Writer : private EncodeCursor {
         for (; has(8, 24) && startsRun(0x800); advance(8, 24)) {
             auto const block = load<Units8>(units);
             Words4 const triples[2] = {triplesOf(widenFront(block)), triplesOf(widenBack(block))};
-            for (int i = 0; i < 7; ++i)
+            for (CFIndex i = 0; i < 7; ++i)
                 store(bytes + 3 * i, triples[i / 4][i % 4]);
             // A fourth byte here would be one too many.
             store(bytes + 21, static_cast<UInt16>(triples[1][3]));

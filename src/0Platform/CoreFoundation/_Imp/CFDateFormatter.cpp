@@ -58,7 +58,7 @@ bool isKnownLanguage(char const* language) {
 // For a language without data ICU would take the process's default locale, whatever that is at the
 // moment. Here it is always English, with the clock of the territory or, as in most, of 24 hours.
 icu::Locale localeOf(CFLocaleRef locale) {
-    icu::Locale const named(dateIdentifierOf(locale));
+    icu::Locale named(dateIdentifierOf(locale));
     if (isKnownLanguage(named.getLanguage()))
         return named;
     constexpr char const* unknownTerritory = "ZZ";

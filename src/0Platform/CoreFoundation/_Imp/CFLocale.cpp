@@ -66,7 +66,7 @@ LocaleName nameOf(char const* name, char const* script, char const* otherwise) {
         if (written < static_cast<int>(LocaleName::capacity))
             return result;
     }
-    std::strcpy(result.text, otherwise);
+    std::snprintf(result.text, LocaleName::capacity, "%s", otherwise);
     return result;
 }
 

@@ -23,14 +23,14 @@ extern "C" CFTypeRef CFRetain(CFTypeRef object) {
     return object;
 }
 
-extern "C" void CFRelease(CFTypeRef reference) {
-    Object& object = objectOf(reference);
+extern "C" void CFRelease(CFTypeRef object) {
+    Object& shared = objectOf(object);
     // A sole owner needs no locked instruction: nobody else can reach the count.
-    if (object.references.load(std::memory_order_acquire) != 1 &&
-        object.references.fetch_sub(1, std::memory_order_acq_rel) != 1)
+    if (shared.references.load(std::memory_order_acquire) != 1 &&
+        shared.references.fetch_sub(1, std::memory_order_acq_rel) != 1)
         return;
-    object.finalize(object);
-    CFObjectFree_(&object);
+    shared.finalize(shared);
+    CFObjectFree_(&shared);
 }
 
 extern "C" CFIndex CFGetRetainCount(CFTypeRef object) {

@@ -81,6 +81,7 @@ void FoldedCluster::append(UInt32 value) noexcept {
     if (count_ == capacity_) {
         capacity_ *= 2;
         UInt32* const old = values_ == inline_ ? nullptr : values_;
+        // NOLINTNEXTLINE(clang-analyzer-optin.portability.UnixAPI): the capacity is never 0
         void* const memory = std::realloc(old, static_cast<std::size_t>(capacity_) * sizeof(value));
         if (memory == nullptr)
             std::abort();

@@ -50,6 +50,7 @@ bool isMark(UInt32 codePoint) noexcept;
 /// A folded character. It is pending while values of it are left.
 class FoldedCluster {
   public:
+    // cppcheck-suppress uninitMemberVar ; filling the room would cost more than most foldings
     FoldedCluster() noexcept {}
     ~FoldedCluster() {
         if (values_ != inline_)

@@ -142,7 +142,7 @@ template <class TMark>
 inline CFIndex clearFront(UniChar const* units, CFIndex count, TMark const& mark) {
     CFIndex index = 0;
     for (; count - index >= 32; index += 32) {
-        auto const marked = [&](int block) {
+        auto const marked = [&](CFIndex block) {
             return mark(load<Units8>(units + index + 8 * block));
         };
         if (clearLanes(marked(0) | marked(1) | marked(2) | marked(3)) < 8)
