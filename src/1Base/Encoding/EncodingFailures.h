@@ -13,9 +13,9 @@ namespace Detail {
 /// Fails as an assertion: a conversion would call itself.
 [[noreturn]] void reportRecursion();
 
-/// Raises TExcEncoding: the platform call `function` failed, with `error`, for `encoding`.
+/// Raises TExcEncoding: the platform call `function` failed, with `error`, for `eenc`.
 [[noreturn]] void throwConversionError(char const* function, std::string const& error,
-                                       ESysEncoding encoding);
+                                       ESysEncoding eenc);
 
 } // namespace Detail
 } // namespace Encoding

@@ -31,7 +31,7 @@ std::string findTarget(CBookmark const& target, std::string const& bookmark) {
     if (exists(target.path))
         return target.path;
     if (!target.relativePath.empty()) {
-        std::string const path = followPath(folderOf(realPath(bookmark)), target.relativePath);
+        std::string path = followPath(folderOf(realPath(bookmark)), target.relativePath);
         if (exists(path))
             return path;
     }

@@ -69,7 +69,7 @@ std::string absolutePath(std::string const& path) {
         return realPath(path);
     if (path.front() == '/')
         return fromRoot(names);
-    std::string const folder = realPath(".");
+    std::string folder = realPath(".");
     if (folder.empty() || names.empty())
         return folder;
     return joinPath(folder, fromRoot(names).substr(1));

@@ -31,7 +31,7 @@ Strings::stringUTF16 normalize(Strings::stringUTF16 const& source, EUTF16Normali
     CFStringGetCharacters(mref, CFRangeMake(0, length), reinterpret_cast<UniChar*>(units.get()));
     units[length] = 0;
     // The text ends at its first zero unit, not at its length: callers rely on the cut.
-    Strings::stringUTF16 const result(units.get());
+    Strings::stringUTF16 result(units.get());
     CFRelease(mref);
     return result;
 }
