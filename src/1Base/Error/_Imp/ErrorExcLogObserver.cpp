@@ -2,6 +2,7 @@
 
 #include "1Base/Error/ErrorMacros.h"
 
+#include <cinttypes>
 #include <cstdint>
 #include <cstdio>
 
@@ -12,8 +13,8 @@ namespace {
 class CAddress {
   public:
     explicit CAddress(void const* address) {
-        std::snprintf(text_, sizeof(text_), "0x%jx",
-                      static_cast<std::uintmax_t>(reinterpret_cast<std::uintptr_t>(address)));
+        std::snprintf(text_, sizeof(text_), "0x%" PRIxPTR,
+                      reinterpret_cast<std::uintptr_t>(address));
     }
 
     char const* text() const { return text_; }

@@ -22,7 +22,7 @@ bool isBelow(char const* severity, ESeverity least) {
 }
 
 bool isNoCharacter(wchar_t element) {
-    auto const code = static_cast<unsigned int>(element);
+    auto const code = static_cast<char32_t>(element);
     return code > 0x10FFFF || (code >= 0xD800 && code <= 0xDFFF);
 }
 

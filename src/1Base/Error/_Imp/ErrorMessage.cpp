@@ -10,7 +10,7 @@ namespace Error {
 CMessage::CMessageLoader const* CMessage::msgLoader_ = nullptr;
 
 Strings::string CMessage::CMessageLoader::load(EMsgID const& id) const {
-    Strings::string const text = doLoadMessage(id);
+    Strings::string text = doLoadMessage(id);
     if (!text.empty())
         return text;
     return L"<#" + StdUtil::stream_cast<Strings::string>(id) + L">?";
