@@ -50,9 +50,9 @@ class CMessage {
         : text_(Encoding::convert<TText>(text)), parameters_(std::move(parameters)) {}
 
     CMessage(CMessage const&) = default; ///< text and parameters as they stand
-    CMessage(CMessage&&) = default;      ///< the same, and the source is left unspecified
+    CMessage(CMessage&&) noexcept = default;      ///< the same, and the source is left unspecified
     CMessage& operator=(CMessage const&) = default; ///< as the copy
-    CMessage& operator=(CMessage&&) = default;      ///< as the move
+    CMessage& operator=(CMessage&&) noexcept = default;      ///< as the move
 
     virtual ~CMessage() = default;
 

@@ -30,10 +30,7 @@ class CParameterList {
         /// Casts the value; raises what the cast raises.
         template <class T>
         CEntry(std::string const& name, T const& value)
-            : value_(StdUtil::stream_cast<std::basic_string<TChar>, T>(value)) {
-            // The cast comes first: where it raises, nothing has been copied.
-            name_ = name;
-        }
+            : value_(StdUtil::stream_cast<std::basic_string<TChar>, T>(value)), name_(name) {}
 
         /// @{
         /// Neither ever changes.
@@ -47,8 +44,9 @@ class CParameterList {
         }
 
       private:
-        std::string name_;
+        // In this order: where the cast raises, nothing has been copied.
         std::basic_string<TChar> value_;
+        std::string name_;
     };
 
     /// Walks in the order of adding; adding ends its validity.

@@ -29,7 +29,7 @@ class CName {
         if (converted_)
             return *converted_ == other;
         return std::equal(begin_, end_, other.begin(), other.end(), [](TChar wide, char narrow) {
-            return static_cast<unsigned long>(wide) == static_cast<unsigned char>(narrow);
+            return static_cast<char>(wide) == narrow;
         });
     }
 
