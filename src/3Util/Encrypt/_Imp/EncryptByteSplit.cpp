@@ -154,13 +154,13 @@ TByteVector splitBytes(TByteVector const& bytes, std::size_t bitsPerGroup) {
 }
 
 TByteVector mergeBytes(TByteVector const& groups, std::size_t bitsPerGroup) {
-    std::size_t const bits = groups.size() * bitsPerGroup;
+    std::size_t const total = groups.size() * bitsPerGroup;
     // With as many bits in the last byte as the last group has, or more, that group began there:
     // the byte waits for a further group, and there is none.
-    ERROR_ASSERT_TEXT(bits % bitsPerByte < bitsPerGroup, "begin != end");
+    ERROR_ASSERT_TEXT(total % bitsPerByte < bitsPerGroup, "begin != end");
     if (bitsPerGroup == bitsPerByte)
         return groups;
-    TByteVector bytes(unitsFor(bits, bitsPerByte));
+    TByteVector bytes(unitsFor(total, bitsPerByte));
     CPlace place = {groups.data(), bytes.data()};
     place = repackBlocks<CMergeBlock>(place, bytes.size(), bitsPerGroup);
     repackUnits(place, groups.data() + groups.size(), bitsPerGroup, bitsPerByte);

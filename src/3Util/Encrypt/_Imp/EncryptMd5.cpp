@@ -5,6 +5,7 @@
 #include <boost/endian/conversion.hpp>
 
 #include <algorithm>
+#include <cstddef>
 #include <cstdint>
 #include <cstring>
 #include <iterator>
@@ -70,8 +71,8 @@ inline void step(std::uint32_t& a, std::uint32_t b, std::uint32_t c, std::uint32
 
 // Four steps of a round: words k, k + stride, ... (mod 16), with the round's four rotations.
 template <class TFunction, unsigned int s1, unsigned int s2, unsigned int s3, unsigned int s4>
-inline void fourSteps(std::uint32_t (&v)[4], std::uint32_t const (&x)[16], unsigned int k,
-                      unsigned int stride, std::uint32_t const* constants) {
+inline void fourSteps(std::uint32_t (&v)[4], std::uint32_t const (&x)[16], std::size_t k,
+                      std::size_t stride, std::uint32_t const* constants) {
     step<TFunction, s1>(v[0], v[1], v[2], v[3], x[k & 15], constants[0]);
     step<TFunction, s2>(v[3], v[0], v[1], v[2], x[(k + stride) & 15], constants[1]);
     step<TFunction, s3>(v[2], v[3], v[0], v[1], x[(k + 2 * stride) & 15], constants[2]);
@@ -94,18 +95,18 @@ void MD5Transform(std::uint32_t (&state)[4], unsigned char const* block, unsigne
     std::uint32_t sum[4] = {state[0], state[1], state[2], state[3]};
     for (; blocks != 0; --blocks, block += blockBytes) {
         std::uint32_t x[16];
-        for (unsigned int i = 0; i < 16; ++i)
+        for (std::size_t i = 0; i < 16; ++i)
             x[i] = boost::endian::load_little_u32(block + 4 * i);
         std::uint32_t v[4] = {sum[0], sum[1], sum[2], sum[3]};
-        for (unsigned int i = 0; i < 4; ++i)
+        for (std::size_t i = 0; i < 4; ++i)
             fourSteps<F, 7, 12, 17, 22>(v, x, 4 * i, 1, sines + 4 * i);
-        for (unsigned int i = 0; i < 4; ++i)
+        for (std::size_t i = 0; i < 4; ++i)
             fourSteps<G, 5, 9, 14, 20>(v, x, 1 + 20 * i, 5, sines + 16 + 4 * i);
-        for (unsigned int i = 0; i < 4; ++i)
+        for (std::size_t i = 0; i < 4; ++i)
             fourSteps<H, 4, 11, 16, 23>(v, x, 5 + 12 * i, 3, sines + 32 + 4 * i);
-        for (unsigned int i = 0; i < 4; ++i)
+        for (std::size_t i = 0; i < 4; ++i)
             fourSteps<I, 6, 10, 15, 21>(v, x, 28 * i, 7, sines + 48 + 4 * i);
-        for (unsigned int i = 0; i < 4; ++i)
+        for (std::size_t i = 0; i < 4; ++i)
             sum[i] += v[i];
     }
     std::copy(std::begin(sum), std::end(sum), state);
