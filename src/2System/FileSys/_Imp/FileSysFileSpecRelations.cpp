@@ -58,7 +58,7 @@ CFileSpec CFileSpec::convertRelativeToAbsolutePath(CFileSpec const& absolute,
                                                    CFileSpec const& relative) {
     ERROR_BLOCK_BEGIN
     CFileSpec const fsAbs = parseUnixPath(absolute.getFullName(false));
-    CFileSpec const fsRel = parseUnixPath(relative.getFullName(false));
+    CFileSpec fsRel = parseUnixPath(relative.getFullName(false));
     ERROR_LOG(TLoggerSpecFileInfo, Error::TTgtLogger, Error::TSevDebug,
               "convertRelativeToAbsolutePath fsAbs", ERROR_PARAM(fsAbs));
     ERROR_LOG(TLoggerSpecFileInfo, Error::TTgtLogger, Error::TSevDebug,
@@ -86,7 +86,7 @@ CFileSpec CFileSpec::convertRelativeToAbsolutePath(CFileSpec const& absolute,
         rel.erase(0, stepUpSize);
     }
 
-    CFileSpec const fs = CFileSpec(abs) + rel;
+    CFileSpec fs = CFileSpec(abs) + rel;
     ERROR_LOG(TLoggerSpecFileInfo, Error::TTgtLogger, Error::TSevDebug,
               "convertRelativeToAbsolutePath", ERROR_PARAM(fs));
     return fs;

@@ -57,7 +57,7 @@ Strings::CParameterList<wchar_t> refusedCall(char const* function, CUniquePath c
 
 CFileSpec doGetTempPathName() {
     ERROR_BLOCK_BEGIN
-    CFileSpec const tmpdir = SysInfo::getSystemTemporaryItemsFolder();
+    CFileSpec tmpdir = SysInfo::getSystemTemporaryItemsFolder();
     ERROR_LOG(TLoggerFileSys, Error::TTgtLogger, Error::TSevDebug,
               "doGetTempPathName: \"@(tmpdir)\".", ERROR_PARAM(tmpdir));
     return tmpdir;
@@ -93,7 +93,7 @@ CFileSpec doCreateTempFile(CFileSpec const& fs) {
     if (descriptor < 0)
         ERROR_THROW(Detail::TExcOSFile, Error::msgOSCallArgs, refusedCall("mkstemp", path));
     close(descriptor);
-    CFileSpec const strtmpfile = path.getFileSpec();
+    CFileSpec strtmpfile = path.getFileSpec();
     ERROR_LOG(TLoggerFileSys, Error::TTgtLogger, Error::TSevDebug,
               "doCreateTempFile: \"@(strtmpfile)\" ", ERROR_PARAM(strtmpfile));
     return strtmpfile;
@@ -107,7 +107,7 @@ CFileSpec doCreateTempFolder(CFileSpec const& fs) {
     errno = 0;
     if (mkdtemp(path.data()) == nullptr)
         ERROR_THROW(Detail::TExcOSFile, Error::msgOSCallArgs, refusedCall("mkdtemp", path));
-    CFileSpec const strtmpfolder = path.getFileSpec();
+    CFileSpec strtmpfolder = path.getFileSpec();
     // The placeholder finds no parameter of its name and stays in the line, which is known so.
     ERROR_LOG(TLoggerFileSys, Error::TTgtLogger, Error::TSevDebug,
               "doCreateTempFolder: \"@(strtmpfile)\" ", ERROR_PARAM(strtmpfolder));
