@@ -12,6 +12,7 @@ project_with_commands() {
   command_that run <<<'echo called'
   command_that scripts/check <<<'echo checked'
   command_that scripts/check-headers <<<'echo "headers with $CXX"'
+  command_that scripts/analyze <<<'echo analyzed'
 }
 
 command_that() {
@@ -38,6 +39,7 @@ AFailedStepIsNamedAndStopsNoOther() {
   expect_said "failed step: tests, g++"
   expect_said called
   expect_said "headers with"
+  expect_said analyzed
   expect_last_line "6 passed, 2 failed, 0 skipped"
 }
 

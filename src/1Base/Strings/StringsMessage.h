@@ -49,10 +49,10 @@ class CMessage {
     CMessage(std::basic_string<TC, TT, TA> const& text, TParameterList parameters)
         : text_(Encoding::convert<TText>(text)), parameters_(std::move(parameters)) {}
 
-    CMessage(CMessage const&) = default; ///< text and parameters as they stand
-    CMessage(CMessage&&) noexcept = default;      ///< the same, and the source is left unspecified
-    CMessage& operator=(CMessage const&) = default; ///< as the copy
-    CMessage& operator=(CMessage&&) noexcept = default;      ///< as the move
+    CMessage(CMessage const&) = default;     ///< text and parameters as they stand
+    CMessage(CMessage&&) noexcept = default; ///< the same, and the source is left unspecified
+    CMessage& operator=(CMessage const&) = default;     ///< as the copy
+    CMessage& operator=(CMessage&&) noexcept = default; ///< as the move
 
     virtual ~CMessage() = default;
 
