@@ -7,6 +7,7 @@
 #ifndef QORN_1BASE_STRINGSKINDS_H
 #define QORN_1BASE_STRINGSKINDS_H
 
+#include "1Base/Strings/StringsCharTraits.h"
 #include "1Base/TemplMeta/TemplMetaTag.h"
 
 #include <string>
