@@ -10,7 +10,20 @@
 
 include_guard(GLOBAL)
 include(GoogleTest)
-find_package(GTest REQUIRED)
+if(NOT TARGET GTest::gtest_main)
+  find_package(GTest REQUIRED)
+endif()
+
+# qorn_library_symbol(<variable> <name with libstdc++> <name with libc++>)
+#
+# The linker's name of a function whose signature holds a text: it differs with the library.
+function(qorn_library_symbol variable of_libstdcxx of_libcxx)
+  if(QORN_LIBCXX OR APPLE)
+    set(${variable} ${of_libcxx} PARENT_SCOPE)
+  else()
+    set(${variable} ${of_libstdcxx} PARENT_SCOPE)
+  endif()
+endfunction()
 
 # qorn_add_skipped_test(<name> <reason>)
 function(qorn_add_skipped_test name reason)

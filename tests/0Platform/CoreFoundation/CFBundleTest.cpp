@@ -56,7 +56,8 @@ void* __wrap_malloc(std::size_t bytes) {
     return mayAllocate() ? __real_malloc(bytes) : nullptr;
 }
 
-void* __wrap__Znwm(std::size_t bytes) {
+// libc++ refers to it, and a hidden function cannot be referred to by a library.
+__attribute__((visibility("default"))) void* __wrap__Znwm(std::size_t bytes) {
     if (!mayAllocate())
         throw std::bad_alloc();
     return __real__Znwm(bytes);

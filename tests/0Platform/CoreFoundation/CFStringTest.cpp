@@ -40,12 +40,13 @@ void* __wrap_realloc(void* memory, std::size_t bytes) {
     return __real_realloc(memory, bytes);
 }
 
-void* __wrap__Znwm(std::size_t bytes) {
+// libc++ refers to these two, and a hidden function cannot be referred to by a library.
+__attribute__((visibility("default"))) void* __wrap__Znwm(std::size_t bytes) {
     ++allocations;
     return __real__Znwm(bytes);
 }
 
-void* __wrap__Znam(std::size_t bytes) {
+__attribute__((visibility("default"))) void* __wrap__Znam(std::size_t bytes) {
     ++allocations;
     return __real__Znam(bytes);
 }

@@ -371,48 +371,52 @@ TEST_F(CErrorExcFailingObserverTest, AFailingObserverDoesNotTouchTheExceptionInT
     EXPECT_THROW(ERROR_THROW(TExcSample, Error::msgDuplicate), TExcSample);
 }
 
-// The error stream flushes the stream that it is tied to before it writes. This one fails at that,
-// once: then it lets go, and the error stream itself is well.
-class CBrokenTie : private std::streambuf {
-  public:
-    CBrokenTie() : stream_(this), old_(std::cerr.tie(&stream_)) {
-        stream_.exceptions(std::ios_base::badbit);
-    }
-    ~CBrokenTie() override { std::cerr.tie(old_); }
-    CBrokenTie(CBrokenTie const&) = delete;
-    CBrokenTie& operator=(CBrokenTie const&) = delete;
-
-  private:
-    int sync() override {
-        std::cerr.tie(nullptr);
-        throw std::runtime_error("sync");
-    }
-
-    std::ostream stream_;
-    std::ostream* old_;
-};
-
-TEST_F(CErrorExcFailingObserverTest, WhereTheErrorStreamFailsTooTheRemainingObserversAreNotTold) {
-    std::unique_ptr<XSample> sample;
-    {
-        CBrokenTie const tie;
-        sample = makeSample();
-    }
-    EXPECT_PRED2(isFatalMessage, written_.str(), toAll);
-    EXPECT_EQ(before_.events.size(), 1U);
-    EXPECT_TRUE(after_.events.empty());
-    written_.str("");
-    {
-        CBrokenTie const tie;
-        sample.reset();
-    }
-    EXPECT_PRED2(isFatalMessage, written_.str(), toAll);
-    EXPECT_EQ(before_.events.size(), 2U);
-    EXPECT_TRUE(after_.events.empty());
-}
-
 // Takes nothing.
 class CBrokenBuffer : public std::streambuf {};
+
+// Fails, and puts another buffer into the error stream when its failure is over: between the line
+// that cannot be written and the next.
+class CMendingObserver : public Error::CExcRegistry::CObserver {
+  public:
+    explicit CMendingObserver(std::streambuf* next) : next_(next) {}
+    void exceptionAdded(CExcImplementation const*, Error::CInfo const&) const override {
+        throw CFailure{next_};
+    }
+    void exceptionRemoved(CExcImplementation const*) const override { throw CFailure{next_}; }
+
+  private:
+    struct CFailure {
+        ~CFailure() { std::cerr.rdbuf(next); }
+        std::streambuf* next;
+    };
+
+    std::streambuf* next_;
+};
+
+TEST_F(CErrorExcRegistryTest, WhereTheErrorStreamFailsTooTheRemainingObserversAreNotTold) {
+    CWitness const before;
+    CWitness const after;
+    std::stringbuf written;
+    CMendingObserver const failing(&written);
+    CRegisteredObserver const registered1(before);
+    CRegisteredObserver const registered2(failing);
+    CRegisteredObserver const registered3(after);
+    CBrokenBuffer broken;
+    CErrorStream const errorStream(&broken);
+    std::cerr.exceptions(std::ios_base::badbit);
+
+    auto sample = makeSample();
+    EXPECT_PRED2(isFatalMessage, written.str(), toAll);
+    EXPECT_EQ(before.events.size(), 1U);
+    EXPECT_TRUE(after.events.empty());
+
+    written.str("");
+    std::cerr.rdbuf(&broken);
+    sample.reset();
+    EXPECT_PRED2(isFatalMessage, written.str(), toAll);
+    EXPECT_EQ(before.events.size(), 2U);
+    EXPECT_TRUE(after.events.empty());
+}
 
 [[noreturn]] void sayTerminated() {
     static char const text[] = "terminated";
@@ -424,9 +428,9 @@ TEST_F(CErrorExcRegistryTest, ARemovalThatFailsEndsTheProcess) {
     auto const die = [] {
         std::set_terminate(sayTerminated);
         auto sample = makeSample();
-        CFailingObserver const failing;
-        registry().registerObserver(&failing);
         CBrokenBuffer broken;
+        CMendingObserver const failing(&broken);
+        registry().registerObserver(&failing);
         CErrorStream const errorStream(&broken);
         std::cerr.exceptions(std::ios_base::badbit);
         sample.reset();

@@ -15,13 +15,13 @@ int initialisations = 0;
 
 } // namespace
 
-// Counts how often a stream is initialised.
-extern "C" {
-void __real__ZNSt8ios_base7_M_initEv(std::ios_base* stream);
-void __wrap__ZNSt8ios_base7_M_initEv(std::ios_base* stream) {
+// Counts how often a stream is initialised. One library's function takes the buffer too, the
+// other's leaves the second argument alone.
+void realInitialise(std::ios_base* stream, void* buffer) __asm__("__real_" INITIALISE);
+void wrapInitialise(std::ios_base* stream, void* buffer) __asm__("__wrap_" INITIALISE);
+void wrapInitialise(std::ios_base* stream, void* buffer) {
     ++initialisations;
-    __real__ZNSt8ios_base7_M_initEv(stream);
-}
+    realInitialise(stream, buffer);
 }
 
 namespace {

@@ -22,12 +22,10 @@
 // What was asked of MacOS::getSpecialFolder, by its numbers.
 static std::vector<std::pair<int, int>> asked;
 
-Strings::string
-realFolder(MacOS::TSystemFolderType type, MacOS::TSystemFolderDomain domain) __asm__(
-    "__real__ZN5MacOS16getSpecialFolderB5cxx11ENS_17TSystemFolderTypeENS_19TSystemFolderDomainE");
-Strings::string
-wrapFolder(MacOS::TSystemFolderType type, MacOS::TSystemFolderDomain domain) __asm__(
-    "__wrap__ZN5MacOS16getSpecialFolderB5cxx11ENS_17TSystemFolderTypeENS_19TSystemFolderDomainE");
+Strings::string realFolder(MacOS::TSystemFolderType type,
+                           MacOS::TSystemFolderDomain domain) __asm__("__real_" SPECIAL_FOLDER);
+Strings::string wrapFolder(MacOS::TSystemFolderType type,
+                           MacOS::TSystemFolderDomain domain) __asm__("__wrap_" SPECIAL_FOLDER);
 
 Strings::string wrapFolder(MacOS::TSystemFolderType type, MacOS::TSystemFolderDomain domain) {
     asked.emplace_back(type, domain);

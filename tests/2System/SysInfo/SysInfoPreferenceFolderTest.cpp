@@ -24,10 +24,8 @@ using Strings::string;
 // What stands in front of MacOS::setHiddenAttribute, where a test wants to see it called.
 static std::function<bool(string const&, bool)> onSetHidden;
 
-bool realSetHidden(string const& path, bool hidden) __asm__(
-    "__real__ZN5MacOS18setHiddenAttributeERKNSt7__cxx1112basic_stringIwSt11char_traitsIwESaIwEEEb");
-bool wrapSetHidden(string const& path, bool hidden) __asm__(
-    "__wrap__ZN5MacOS18setHiddenAttributeERKNSt7__cxx1112basic_stringIwSt11char_traitsIwESaIwEEEb");
+bool realSetHidden(string const& path, bool hidden) __asm__("__real_" SET_HIDDEN);
+bool wrapSetHidden(string const& path, bool hidden) __asm__("__wrap_" SET_HIDDEN);
 
 bool wrapSetHidden(string const& path, bool hidden) {
     return onSetHidden ? onSetHidden(path, hidden) : realSetHidden(path, hidden);

@@ -31,17 +31,17 @@ static bool sayTo(std::string const& question) {
     return yes;
 }
 
-string fullOrLoginName(bool login) __asm__("__wrap__ZN5MacOS11getUserNameB5cxx11Eb");
+string fullOrLoginName(bool login) __asm__("__wrap_" USER_NAME);
 string fullOrLoginName(bool login) {
     return answerTo(login ? "login name" : "full name");
 }
 
-string machineName() __asm__("__wrap__ZN5MacOS14getMachineNameB5cxx11Ev");
+string machineName() __asm__("__wrap_" MACHINE_NAME);
 string machineName() {
     return answerTo("machine");
 }
 
-string emailAddress() __asm__("__wrap__ZN5MacOS19getUserEmailAddressB5cxx11Ev");
+string emailAddress() __asm__("__wrap_" EMAIL_ADDRESS);
 string emailAddress() {
     return answerTo("e-mail");
 }
