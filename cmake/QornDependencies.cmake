@@ -3,13 +3,17 @@
 
 include_guard(GLOBAL)
 
-# Boost's own package file; from release 3.30 on CMake warns where its module is meant.
-if(POLICY CMP0167)
-  cmake_policy(SET CMP0167 NEW)
+if(QORN_LIBCXX)
+  include(QornLibcxx)
+else()
+  # Boost's own package file; from release 3.30 on CMake warns where its module is meant.
+  if(POLICY CMP0167)
+    cmake_policy(SET CMP0167 NEW)
+  endif()
+  # Archives, so that the product meets no other Boost in the host's process.
+  set(Boost_USE_STATIC_LIBS ON)
+  find_package(Boost 1.81 REQUIRED COMPONENTS filesystem thread)
 endif()
-# Archives, so that the product meets no other Boost in the host's process.
-set(Boost_USE_STATIC_LIBS ON)
-find_package(Boost 1.81 REQUIRED COMPONENTS filesystem thread)
 if(NOT APPLE)
   find_package(ICU 72 REQUIRED COMPONENTS uc i18n data)
   find_package(Plist REQUIRED)

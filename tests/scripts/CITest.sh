@@ -28,7 +28,7 @@ AllStepsPass() {
   expect_success bash "$project/.ci/run"
   expect_said "headers with clang++"
   expect_not_said "failed step"
-  expect_last_line "10 passed, 0 failed, 2 skipped"
+  expect_last_line "15 passed, 0 failed, 3 skipped"
 }
 
 AFailedStepIsNamedAndStopsNoOther() {
@@ -40,7 +40,7 @@ AFailedStepIsNamedAndStopsNoOther() {
   expect_said called
   expect_said "headers with"
   expect_said analyzed
-  expect_last_line "6 passed, 2 failed, 0 skipped"
+  expect_last_line "9 passed, 3 failed, 0 skipped"
 }
 
 AStepThatFailsBeforeItsTestsIsAFailure() {
