@@ -15,6 +15,7 @@
 #include "1Base/Strings/StringsKinds.h"
 
 #include <fstream>
+#include <ios>
 #include <istream>
 #include <ostream>
 #include <string>
@@ -34,6 +35,9 @@ class basic_filebufW : public std::basic_filebuf<TChar, TTraits> {
 
 /// The file buffer of a stream. It is the first base of each stream, so that the buffer is built
 /// before the standard stream is given it. It cannot be copied or moved: the stream points into it.
+///
+/// Building it may fail. By then the standard stream's own base must be initialised, since it can
+/// be destroyed in no other state: each stream sees to that itself.
 template <class TChar, class TTraits = std::char_traits<TChar>>
 class CFStreamW {
   public:
@@ -54,7 +58,8 @@ class basic_ifstreamW : public CFStreamW<TChar, TTraits>,
                         public std::basic_istream<TChar, TTraits> {
   public:
     basic_ifstreamW(wchar_t const* path, unsigned int mode)
-        : CFStreamW<TChar, TTraits>(path, mode | static_cast<unsigned int>(std::ios_base::in)),
+        : std::basic_ios<TChar, TTraits>(nullptr),
+          CFStreamW<TChar, TTraits>(path, mode | static_cast<unsigned int>(std::ios_base::in)),
           std::basic_istream<TChar, TTraits>(&this->filebuf_) {
         if (!this->is_open())
             this->setstate(std::ios_base::failbit);
@@ -67,7 +72,8 @@ class basic_ofstreamW : public CFStreamW<TChar, TTraits>,
                         public std::basic_ostream<TChar, TTraits> {
   public:
     basic_ofstreamW(wchar_t const* path, unsigned int mode)
-        : CFStreamW<TChar, TTraits>(path, mode | static_cast<unsigned int>(std::ios_base::out)),
+        : std::basic_ios<TChar, TTraits>(nullptr),
+          CFStreamW<TChar, TTraits>(path, mode | static_cast<unsigned int>(std::ios_base::out)),
           std::basic_ostream<TChar, TTraits>(&this->filebuf_) {
         if (!this->is_open())
             this->setstate(std::ios_base::failbit);
@@ -80,7 +86,8 @@ class basic_fstreamW : public CFStreamW<TChar, TTraits>,
                        public std::basic_iostream<TChar, TTraits> {
   public:
     basic_fstreamW(wchar_t const* path, unsigned int mode)
-        : CFStreamW<TChar, TTraits>(path, mode),
+        : std::basic_ios<TChar, TTraits>(nullptr),
+          CFStreamW<TChar, TTraits>(path, mode),
           std::basic_iostream<TChar, TTraits>(&this->filebuf_) {
         if (!this->is_open())
             this->setstate(std::ios_base::failbit);
