@@ -47,6 +47,12 @@ AnUndefinedSymbolFails() {
   expect_failure 1 "undefined symbol: _Z6absentv" "$root/scripts/check-exports" "$library"
 }
 
+EachFailureIsTold() {
+  library_with 'int fifth() { return 5; }' -Wl,-z,norelro -Wl,-z,now
+  expect_failure 1 "> _Z5fifthv" "$root/scripts/check-exports" "$library"
+  expect_said "RELRO"
+}
+
 ALibraryWithoutReadOnlyRelocationsFails() {
   library_with '' -Wl,-z,norelro -Wl,-z,now
   expect_failure 1 "RELRO" "$root/scripts/check-exports" "$library"
