@@ -1,5 +1,5 @@
-# The library of a Mac, linked by LLVM's linker with the list of exports, and read by LLVM's tools under
-# the names that Apple's have.
+# The library of a Mac, linked by LLVM's linker with the list of exports, and read by LLVM's tools
+# under the names that Apple's have.
 # shellcheck shell=bash
 # shellcheck source=tests/scripts/support.sh
 source "$(dirname -- "${BASH_SOURCE[0]}")/support.sh"
@@ -19,7 +19,7 @@ chmod +x -- "$work/bin/uname"
 library=$project/libQORNOpenOffice.jnilib
 oldest=11.0
 
-# link_for <processor> <output> <option>...: what lies in a folder of its own, so that its name is free.
+# link_for <processor> <output> <option>...
 link_for() {
   "$llvm/ld64.lld" -dylib -arch "$1" -platform_version macos "$oldest" "$oldest" -o "$2" "${@:3}"
 }

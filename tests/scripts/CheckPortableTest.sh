@@ -25,8 +25,8 @@ WhatBashHasAlwaysHadPasses() {
 }
 
 ItsOwnToolsPass() {
-  accepts 'readlink -f -- "$x"' 'mktemp -d' 'sed -n s/a/b/p' 'grep -qxF -- a' 'sort -u' 'rm -rf -- x' \
-    'getconf _NPROCESSORS_ONLN' '"$x/timeout"'
+  accepts 'readlink -f -- "$x"' 'mktemp -d' 'sed -n s/a/b/p' 'grep -qxF -- a' 'sort -u' \
+    'rm -rf -- x' 'getconf _NPROCESSORS_ONLN' '"$x/timeout"'
 }
 
 ACommentMaySayAnything() { accepts '# mapfile, sed -i'; }

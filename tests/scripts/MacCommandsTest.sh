@@ -113,9 +113,9 @@ AMissingHomebrewIsTold() {
 
 MissingToolsOfAppleAreTold() {
   macos
-  stub xcode-select <<<'echo "xcode-select: error: unable to get active developer directory" >&2; exit 2'
-  expect_failure 1 "Apple's command line tools are missing; this installs them: xcode-select --install" \
-    "$project/run"
+  stub xcode-select <<<'echo "xcode-select: error: no developer tools were found" >&2; exit 2'
+  expect_failure 1 "Apple's command line tools are missing" "$project/run"
+  expect_said "this installs them: xcode-select --install"
   expect_one_line
 }
 

@@ -59,14 +59,15 @@ check_cocoa() {
 }
 
 check_product() {
-  local libraries
+  local libraries expected
   check_command "$product" -dynamiclib "-install_name @rpath/libQORNOpenOffice.jnilib" \
     -Wl,-rpath,@loader_path "-Xlinker -exported_symbols_list"
   command_with " -o $product " | grep -qE -e '-Xlinker "?[^ "].*/cmake/exports\.txt"? ' ||
     fail "no list of exports"
   libraries=$(command_with " -o $product " |
     grep -oE -e '[^/ ]+\.(a|dylib)( |$)' -e ' -l[^ ]+' | tr -d ' ' | sort)
-  [ "$libraries" = "$(printf '%s\n' libboost_{filesystem,thread}.a libqorn_{1base,2system,3util}.a)" ] ||
+  expected=$(printf '%s\n' libboost_{filesystem,thread}.a libqorn_{1base,2system,3util}.a)
+  [ "$libraries" = "$expected" ] ||
     fail "the product is linked with:" "$libraries"
 }
 
