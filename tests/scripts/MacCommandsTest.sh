@@ -22,18 +22,18 @@ WhereNothingIsMissingBrewInstallsNothing() {
 WhatIsMissingIsInstalledWithoutAnUpdate() {
   macos
   remove_package boost
-  remove_package openjdk
+  remove_package openjdk@17
   expect_configured run
-  expect_said "installing boost openjdk"
-  expect_brew_calls "brew install --formula boost openjdk, no update"
+  expect_said "installing boost openjdk@17"
+  expect_brew_calls "brew install --formula boost openjdk@17, no update"
 }
 
 APackageWhoseNameOnlyBeginsAlikeIsAnother() {
   macos
-  remove_package openjdk
-  echo openjdk@17 >>"$work/installed"
+  remove_package boost
+  echo boost-python3 >>"$work/installed"
   expect_configured run
-  expect_brew_calls "brew install --formula openjdk, no update"
+  expect_brew_calls "brew install --formula boost, no update"
 }
 
 TheTestsNeedTheirPackagesToo() {
@@ -107,7 +107,7 @@ AMissingHomebrewIsTold() {
   macos
   rm -- "$work/bin/brew"
   [ ! -x /usr/local/bin/brew ] || skip "there is a Homebrew on this system"
-  expect_failure 1 "there is no Homebrew to install: cmake ninja boost openjdk" "$project/run"
+  expect_failure 1 "there is no Homebrew to install: cmake ninja boost openjdk@17" "$project/run"
   expect_one_line
 }
 

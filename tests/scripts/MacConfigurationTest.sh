@@ -191,7 +191,7 @@ AMacWithIntelsProcessorIsKnown() {
 
 TheStandInForJavaIsNoJava() {
   mac arm64 /opt/homebrew
-  rm -- "$mac/opt/homebrew/opt/openjdk"
+  rm -- "$mac/opt/homebrew/opt/openjdk@17"
   # Found only where the folder above the stand-in is taken for a Java's.
   add_to_mac /usr/lib/server/libjvm.dylib </dev/null
   expect_failure 1 "JAVA_INCLUDE_PATH2 JVM)" configure "$root"

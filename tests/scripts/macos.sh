@@ -92,15 +92,15 @@ END
 
 # Homebrew's links lead through its own folder of programs to the Java that lies beside.
 add_java() {
-  local keg=$homebrew/Cellar/openjdk/25.0.1 tool
+  local keg=$homebrew/Cellar/openjdk@17/17.0.20 tool
   java_home=$mac$keg/libexec/openjdk.jdk/Contents/Home
   mkdir -p -- "$mac$keg/bin" "$mac$homebrew/opt"
   for tool in jar java javac javadoc; do
     # shellcheck disable=SC2028 # the program reads the escapes
-    add_tool "${java_home#"$mac"}/bin/$tool" 'echo "openjdk version \"25.0.1\"" >&2'
+    add_tool "${java_home#"$mac"}/bin/$tool" 'echo "openjdk version \"17.0.20\"" >&2'
     ln -s -- "../libexec/openjdk.jdk/Contents/Home/bin/$tool" "$mac$keg/bin/$tool"
   done
-  ln -s -- ../Cellar/openjdk/25.0.1 "$mac$homebrew/opt/openjdk"
+  ln -s -- ../Cellar/openjdk@17/17.0.20 "$mac$homebrew/opt/openjdk@17"
   add_to_mac "${java_home#"$mac"}/include/jni.h" <<<'#include "jni_md.h"'
   add_to_mac "${java_home#"$mac"}/include/darwin/jni_md.h" </dev/null
   add_to_mac "${java_home#"$mac"}/lib/server/libjvm.dylib" </dev/null

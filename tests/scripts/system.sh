@@ -53,7 +53,7 @@ END
 macos() {
   isolate_commands
   export WORK=$work
-  printf '%s\n' cmake ninja boost openjdk ca-certificates >"$work/installed"
+  printf '%s\n' cmake ninja boost openjdk@17 ca-certificates >"$work/installed"
   : >"$work/calls"
   user 501
   stub uname <<<'echo Darwin'
