@@ -113,10 +113,10 @@ configure() {
     -S "$1" -B "$build" "${@:2}"
 }
 
-# Writes all commands of the build, one a line, to a file that `commands` names.
+# Writes all commands of the build, one a line and without quotes, to a file that `commands` names.
 list_commands() {
   commands=$work/commands
-  ninja -C "$build" -t commands >"$commands"
+  ninja -C "$build" -t commands | tr -d '"\\' >"$commands"
 }
 
 # command_with <text>...: prints the one command that holds all of the texts.
