@@ -11,6 +11,7 @@ project_with_commands() {
   command_that test <<<'echo "skipped: a: no volume"; echo "5 passed, 0 failed, 1 skipped"'
   command_that run <<<'echo called'
   command_that scripts/check <<<'echo checked'
+  command_that scripts/docs <<<'echo documented'
   command_that scripts/check-headers <<<'echo "headers with $CXX"'
   command_that scripts/analyze <<<'echo analyzed'
 }
@@ -27,6 +28,7 @@ AllStepsPass() {
   project_with_commands
   expect_success bash "$project/.ci/run"
   expect_said "headers with clang++"
+  expect_said documented
   expect_not_said "failed step"
   expect_last_line "15 passed, 0 failed, 3 skipped"
 }
