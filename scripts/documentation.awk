@@ -89,11 +89,20 @@ function with_links(line,    done, start, target, text, opening) {
       # As a link of Markdown one to a page that is not ours would be looked up.
       done = done substr(text, 1, opening - 1) \
         "<a href=\"" reference(target) "\">" substr(text, opening + 1) "</a>"
+    } else if (opening) {
+      # Within the text of a reference Doxygen shows backquotes as they are.
+      done = done substr(text, 1, opening) without_quotes(substr(text, opening + 1)) \
+        "](" reference(target) ")"
     } else {
       done = done text "](" reference(target) ")"
     }
   }
   return done line
+}
+
+function without_quotes(text) {
+  gsub(/`/, "", text)
+  return text
 }
 
 function last_bracket(text,    i) {
