@@ -150,8 +150,7 @@ function resolved(file) {
   return file
 }
 
-function exists(file,    line, status) {
-  status = (getline line < file)
-  close(file)
-  return status >= 0
+function exists(file) {
+  gsub(/'/, "'\\''", file)
+  return system("test -e '" file "'") == 0
 }

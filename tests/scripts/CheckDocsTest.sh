@@ -190,19 +190,19 @@ picture_of() {
   add_file docs/pictures/a.dot <<<'digraph { a -> b }'
   add_file docs/pictures/a.svg <<END
 <svg xmlns="http://www.w3.org/2000/svg"/>
-<!-- scripts/docs drew this from a.dot, sha256 $1 -->
+<!-- scripts/docs drew this from a.dot, $1 -->
 END
 }
 
 APictureOfItsSourcePasses() {
   project_with_header </dev/null
-  picture_of "$(sha256sum <<<'digraph { a -> b }' | cut -d ' ' -f 1)"
+  picture_of "$(git hash-object --stdin <<<'digraph { a -> b }')"
   passes
 }
 
 APictureOfAnotherSourceFails() {
   project_with_header </dev/null
-  picture_of "$(sha256sum <<<'digraph { b -> a }' | cut -d ' ' -f 1)"
+  picture_of "$(git hash-object --stdin <<<'digraph { b -> a }')"
   rejects "docs/pictures/a.dot: its picture is missing or older"
 }
 
