@@ -30,13 +30,13 @@ list_blocks() {
   ' "$1"
 }
 
-# block <heading> <language>: the lines of the one such block.
+# block <heading> <language> [<file>]: the lines of the one such block, of the README by default.
 block() {
   awk -v heading="$1" -v fence="\`\`\`$2" '
     /^#+ / && !inside { here = $0; sub(/^#+ /, "", here) }
     /^```/ { inside = !inside; chosen = inside && here == heading && $0 == fence; next }
     chosen
-  ' "$root/README.md"
+  ' "$root/${3:-README.md}"
 }
 
 EveryBlockHasItsTest() {
@@ -106,7 +106,8 @@ was_called() {
   return 1
 }
 
-TheCommandsAreThoseOfCI() {
+# expect_called <text>: .ci/run has called each command in the text, and there is one.
+expect_called() {
   local command count=0
   commands_of_ci >"$work/called"
   while IFS= read -r command; do
@@ -115,10 +116,18 @@ TheCommandsAreThoseOfCI() {
       was_called "$command" || fail ".ci/run does not run: $command"
       count=$((count + 1))
     fi
-  done < <(block "Two commands" sh)
+  done <<<"$1"
   [ "$count" -gt 0 ] || fail "there is no command"
+}
+
+TheCommandsAreThoseOfCI() {
+  expect_called "$(block "Two commands" sh)"
   ! was_called "./test tsan" || fail "another command counts for this one"
   ! was_called ./tes || fail "half a command counts"
+}
+
+TheCommandsForContributorsAreThoseOfCI() {
+  expect_called "$(block "Before you begin" sh CONTRIBUTING.md)"
 }
 
 TheClassInJavaRuns() {
