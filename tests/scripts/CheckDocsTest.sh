@@ -8,7 +8,7 @@ project_with_header() {
   cp -- "$root/scripts/documentation.awk" "$project/scripts/"
   add_file docs/Doxyfile <"$root/docs/Doxyfile"
   add_file CMakeLists.txt <<<'project(qorn VERSION 1.2.3 LANGUAGES CXX)'
-  add_file README.md <<<'# Project'
+  add_file README.md <<<$'# Project\n\nSee [the page](docs/page.md) and [the other](docs/other.md).'
   add_file CHANGELOG.md <<<$'# Changes\n\n## [1.2.3] - 2026-11-22'
   add_file CONTRIBUTING.md <<<'# How'
   add_file docs/page.md <<'END'
@@ -18,6 +18,7 @@ project_with_header() {
 
 Here.
 END
+  add_file docs/other.md <<<'# Another'
   {
     printf '%s\n' '/// Sums.' '#ifndef A_H' '#define A_H' '/// Numbers.' 'namespace A {'
     cat
@@ -120,8 +121,8 @@ LinksThatLeadSomewherePass() {
   add_file README.md <<'END'
 # Project
 
-See [the page](docs/page.md), [its words](docs/page.md#two-words), [the header](src/1Base/A/A.h) and
-[the sources](CMakeLists.txt).
+See [the page](docs/page.md), [its words](docs/page.md#two-words), [the other](docs/other.md),
+[the header](src/1Base/A/A.h) and [the sources](CMakeLists.txt).
 END
   add_file docs/other.md <<'END'
 # Another
@@ -167,6 +168,12 @@ ALinkToNoFileFails() {
 See [that](../src/Nothing.cpp).
 END
   rejects "docs/other.md:3"
+}
+
+APageThatNobodyLinksFails() {
+  project_with_header </dev/null
+  add_file docs/lonely.md <<<'# Lonely'
+  rejects "docs/lonely.md: no link in README.md leads there"
 }
 
 APictureThatIsMissingFails() {
