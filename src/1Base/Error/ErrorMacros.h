@@ -14,24 +14,29 @@
 #define ERROR_ORIGIN __FILE__, __LINE__, __PRETTY_FUNCTION__, __DATE__, __TIME__
 
 /// A named parameter whose name is the expression's text and whose value is its value.
+///
 ///     ERROR_PARAM(fs.getFullName(false))
 #define ERROR_PARAM(...) ::Error::buildNamedParameter(#__VA_ARGS__, (__VA_ARGS__))
 
 /// Parameters in the order in which they are written, or none; a sum of them would permute them.
+///
 ///     ERROR_PARAMS(ERROR_PARAM(type), ERROR_PARAM(key))
 #define ERROR_PARAMS(...) ::Error::inOrder(__VA_ARGS__)
 
 /// Raises an exception of the chain TExcX: with a catalogue text and parameters or none, with a
 /// message, or as a wrapper of another exception.
+///
 ///     ERROR_THROW(TExcFileSpec, Error::msgNotFound,
 ///                 ERROR_PARAMS(ERROR_PARAM(type), ERROR_PARAM(key)));
 #define ERROR_THROW(TExcX, ...) throw ::Error::XExc<TExcX>(ERROR_ORIGIN, __VA_ARGS__)
 
 /// A guarded block. What leaves it has gained an entry in its trace, and a std::exception has
 /// become one of the family.
+///
 ///     ERROR_BLOCK_BEGIN
 ///         remove(path);
 ///     ERROR_BLOCK_END
+///
 /// The handler for the family saves what the catch-all would cost it, a second rethrow.
 #define ERROR_BLOCK_BEGIN                                                                          \
     {                                                                                              \
@@ -59,6 +64,7 @@
 #define ERROR_ASSERT(...) ERROR_ASSERT_TEXT((__VA_ARGS__), ERROR_TEXT_(__VA_ARGS__))
 
 /// The same with one named parameter, or a list of parameters, for the report.
+///
 ///     ERROR_ASSERT_P(ERROR_PARAM(n), n > 0);
 #define ERROR_ASSERT_P(param, ...)                                                                 \
     (::Error::Detail::CAsserter_<true, true>::do_assert(ERROR_ORIGIN, (__VA_ARGS__),               \
@@ -70,6 +76,7 @@
                                                         ::Error::Detail::CAssertDummy()))
 
 /// Logs a text, char const* or wchar_t const*, with parameters of any form or none.
+///
 ///     ERROR_LOG(TLoggerFileSys, Error::TTgtLogger, Error::TSevDebug, "copying @(key)",
 ///               ERROR_PARAM(key));
 #define ERROR_LOG(TLogger, TTarget, TSeverity, ...)                                                \

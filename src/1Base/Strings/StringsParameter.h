@@ -34,6 +34,7 @@ class CStaticNamedParameter {
 };
 
 /// Names a value for the length of the statement.
+///
 ///     buildNamedParameter("line", 7)
 template <class T>
 constexpr CStaticNamedParameter<T> buildNamedParameter(char const* name, T const& value) {

@@ -111,6 +111,7 @@ class CFileSpec {
     /// stays. An absolute `relative` comes back unchanged. The root loses its separator: "/" with
     /// "x" is "x". Raises the chain of file information below TExcFileInfo and TExcFileSpec where
     /// it climbs above the start.
+    ///
     ///     convertRelativeToAbsolutePath(L"/a/b", L"../c");   // "/a/c"
     static CFileSpec convertRelativeToAbsolutePath(CFileSpec const& absolute,
                                                    CFileSpec const& relative);

@@ -61,6 +61,7 @@ CFileSpec setFileType(CFileSpec const& spec, Strings::string const& type);
 /// Changes `spec` to the first name `stem_number.extension` that does not exist, counting from the
 /// number that the name has already, or from 1. False, and nothing changed, where `spec` itself
 /// does not exist. The name is not reserved.
+///
 ///     indexFile(spec, 3);   // "a.txt" becomes "a_001.txt"
 bool indexFile(CFileSpec& spec, unsigned int digits);
 

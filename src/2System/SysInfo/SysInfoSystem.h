@@ -59,7 +59,9 @@ SystemInfo GetOperatingSystemInformation();
 
 /// @{
 /// The product's name and the version. The second is not cached.
+///
 ///     GetOperatingSystemInformation_({10, 11, 6});   // "Mac OS X 10.11.6"
+///
 /// The first is: the text for the argument of the first call is the answer to all later ones,
 /// whatever they ask for.
 Strings::string GetOperatingSystemInformation(SystemInfo const& info);

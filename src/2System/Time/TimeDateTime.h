@@ -120,6 +120,7 @@ class CDateTime : public CDate, public CTime {
     /// Reads a date of one of the UN/CEFACT formats (list 2379): 2, 3, 4, 5, 101, 102, 201 to 204.
     /// Years of two digits get no century and are refused as dates. Raises TExcTimeDateTime, and
     /// TExcStreamCast for a field of the time that is no number.
+    ///
     ///     readDateTimeFromCEFACTFormatCode(L"20210305", 102);   // 5 March 2021, 00:00:00
     static CDateTime readDateTimeFromCEFACTFormatCode(Strings::string const& text, int code);
 };
