@@ -1,4 +1,4 @@
-# qorn_add_compile_failure_test(<name> SOURCE <file> EXPECT <regex> [LIBRARIES ...])
+# qorn_add_compile_failure_test(<name> SOURCE <file> EXPECT <regex> [LIBRARIES ...] [OPTIONS ...])
 #
 # A test that a wrong use does not compile. The source holds the wrong form under
 # `#ifdef QORN_WRONG_USE` and the right one, as like it as can be, under `#else`:
@@ -12,17 +12,18 @@
 # The test passes only if the right form compiles and the wrong one fails with a message that matches
 # EXPECT, so a misspelt name or a missing header does not pass for the refusal that is meant. GCC and
 # clang word their messages differently: EXPECT names what is common to both, or an alternative.
-# LIBRARIES are targets whose include folders and definitions the source needs.
+# LIBRARIES are targets whose include folders and definitions the source needs, OPTIONS are the
+# compiler's.
 
 include_guard(GLOBAL)
 
 function(qorn_add_compile_failure_test name)
-  cmake_parse_arguments(PARSE_ARGV 1 arg "" "SOURCE;EXPECT" "LIBRARIES")
+  cmake_parse_arguments(PARSE_ARGV 1 arg "" "SOURCE;EXPECT" "LIBRARIES;OPTIONS")
   set(usage qorn_compile_failure_${name})
   add_library(${usage} INTERFACE)
   target_link_libraries(${usage} INTERFACE ${arg_LIBRARIES})
 
-  set(flags ${CMAKE_CXX17_EXTENSION_COMPILE_OPTION})
+  set(flags ${CMAKE_CXX17_EXTENSION_COMPILE_OPTION} ${arg_OPTIONS})
   if(CMAKE_OSX_SYSROOT)
     list(APPEND flags -isysroot ${CMAKE_OSX_SYSROOT})
   endif()
