@@ -69,8 +69,8 @@ class CFileSpec {
 
     /// The text in another string kind: std::string, which is UTF-8, goes to POSIX calls.
     template <class TString>
-    TString getFullName(bool forSystemCall) const {
-        return Encoding::convert<TString>(getFullName(forSystemCall));
+    TString getFullName([[maybe_unused]] bool forSystemCall) const {
+        return Encoding::convert<TString>(path_);
     }
 
     /// Whether the text is empty.
@@ -163,6 +163,9 @@ class CFileSpec {
     static Strings::string getForbiddenChars();
 
   private:
+    friend bool operator==(CFileSpec const& left, CFileSpec const& right);
+    friend bool operator<(CFileSpec const& left, CFileSpec const& right);
+
     Strings::string path_;
 };
 

@@ -236,29 +236,96 @@ TEST_F(FileSysDirIteratorSizeTest, TenThousandEmptyFoldersFitASmallStack) {
     });
 }
 
-// A chain of folders named "d", deeper than any path reaches.
-void makeChain(std::string const& root, int depth) {
-    int folder = open(root.c_str(), O_DIRECTORY | O_RDONLY);
-    ASSERT_GE(folder, 0);
-    for (int i = 0; i < depth; ++i) {
-        ASSERT_EQ(mkdirat(folder, "d", 0777), 0);
-        int const next = openat(folder, "d", O_DIRECTORY | O_RDONLY);
-        ASSERT_GE(next, 0);
-        close(folder);
-        folder = next;
+// A folder that no single call can reach by its path.
+class CDeepFolder {
+  public:
+    // Below a chain of `depth` folders that are all named so.
+    CDeepFolder(std::string const& root, std::string const& name, int depth)
+        : folder_(open(root.c_str(), O_DIRECTORY | O_RDONLY)) {
+        for (int i = 0; i < depth; ++i) {
+            int const above = folder_;
+            EXPECT_EQ(mkdirat(above, name.c_str(), 0777), 0);
+            folder_ = openat(above, name.c_str(), O_DIRECTORY | O_RDONLY);
+            close(above);
+        }
+        EXPECT_GE(folder_, 0);
     }
-    close(folder);
-}
+    CDeepFolder(CDeepFolder const&) = delete;
+    CDeepFolder& operator=(CDeepFolder const&) = delete;
+    ~CDeepFolder() { close(folder_); }
+
+    void makeFolder(char const* name) const { EXPECT_EQ(mkdirat(folder_, name, 0777), 0); }
+    void makeLink(char const* target, char const* name) const {
+        EXPECT_EQ(symlinkat(target, folder_, name), 0);
+    }
+    void makeFile(char const* name) const {
+        int const file = openat(folder_, name, O_CREAT | O_WRONLY, 0666);
+        EXPECT_GE(file, 0);
+        close(file);
+    }
+
+  private:
+    int folder_;
+};
 
 TEST_F(FileSysDirIteratorSizeTest, AChainOfTenThousandFoldersFitsASmallStack) {
-    makeChain(volume(), 10000);
-    // The system takes paths of less than PATH_MAX bytes. The last folder is delivered although it
-    // can't be opened any more.
-    std::size_t const openable = (PATH_MAX - 1 - volume().size()) / 2;
-    runOnSmallStack([this, openable] {
+    static constexpr std::size_t depth = 10000;
+    { CDeepFolder const bottom(volume(), "d", depth); }
+    runOnSmallStack([this] {
         EXPECT_EQ(walk(volume(), CDirIterator::eRecursive, CDirIterator::eFiles), TNames());
-        EXPECT_EQ(walk(volume(), CDirIterator::eRecursive, both).size(), openable + 1);
+        std::size_t delivered = 0;
+        std::size_t length = volume().size();
+        for (CDirIterator entry(CFileSpec(volume()), CDirIterator::eRecursive, both);
+             entry != CDirIterator(); ++entry, ++delivered) {
+            length += 2;
+            ASSERT_EQ(entry->getFullName(false).size(), length);
+        }
+        EXPECT_EQ(delivered, depth);
     });
+}
+
+TEST_F(FileSysDirIteratorSizeTest, BeyondTheLongestPathEntriesAreWhatTheyAreElsewhere) {
+    std::string const name(150, 'n');
+    CDeepFolder const bottom(volume(), name, 40);
+    bottom.makeFile("file.x");
+    bottom.makeFolder("folder.x");
+    bottom.makeFile("folder.x/inside");
+    bottom.makeLink("file.x", "to file");
+    bottom.makeLink("folder.x", "to folder");
+    bottom.makeLink("missing", "to nothing");
+    bottom.makeLink("file.x/none", "through a file");
+    bottom.makeLink("/dev/null", "to a device");
+
+    TNames const all = walk(volume(), CDirIterator::eRecursive, both);
+    ASSERT_GT(all.size(), 40U);
+    std::string const folder = all[39];
+    ASSERT_GT(folder.size(), static_cast<std::size_t>(PATH_MAX));
+    EXPECT_FALSE(CFileSpec(below(folder)).exists()) << "a single question does not reach it";
+    TNames expected;
+    for (char const* const entry :
+         {"file.x", "to file", "folder.x", "folder.x/inside", "to folder", "to folder/inside"})
+        expected.push_back(folder + "/" + entry);
+    EXPECT_EQ(TNames(all.begin() + 40, all.end()), expected);
+    EXPECT_EQ(walk(volume(), CDirIterator::eRecursive, both, L"x"),
+              (TNames{expected[0], expected[2]}));
+}
+
+// The system ends it where all is within one path. Behind that it would begin anew with each piece.
+TEST_F(FileSysDirIteratorSizeTest, ACycleOfLinksEndsWhateverTheLengthOfItsNames) {
+    for (std::size_t const length : {1, 150, 250}) {
+        std::string const name(length, 'n');
+        makeFolders(below(name));
+        makeLink("..", below(name + "/up"));
+        // The folder itself, then forty times the link and the folder behind it.
+        EXPECT_EQ(walk(volume(), CDirIterator::eRecursive, both).size(), 81U) << length;
+        TestSupport::removeTree(below(name));
+    }
+}
+
+TEST_F(FileSysDirIteratorSizeTest, ALinkInACircleEndsAListingBeyondTheLongestPathToo) {
+    CDeepFolder const bottom(volume(), std::string(200, 'n'), 30);
+    bottom.makeLink("loop", "loop");
+    EXPECT_EQ(walk(volume(), CDirIterator::eRecursive, both).size(), 30U);
 }
 
 TEST_F(FileSysDirIteratorSizeTest, AHundredThousandFilesComeInOrder) {

@@ -2,54 +2,29 @@
 
 #include "1Base/Encoding/EncodingConverter.h"
 #include "2System/FileSys/_Imp/FileSysDirListing.h"
+#include "2System/FileSys/_Imp/FileSysDirSiblings.h"
 
 #include <boost/filesystem/file_status.hpp>
-#include <boost/filesystem/operations.hpp>
 #include <boost/filesystem/path.hpp>
 
-#include <algorithm>
 #include <deque>
 #include <exception>
 #include <string>
+#include <string_view>
 #include <utility>
-#include <vector>
 
 namespace FileSys {
 namespace {
 
-// An entry that was found, with the status of what it leads to.
-struct SFileData_t {
-    boost::filesystem::path path;
-    boost::filesystem::file_status status;
-
-    bool is_directory() const { return boost::filesystem::is_directory(status); }
-    bool is_file() const { return boost::filesystem::is_regular_file(status); }
-};
-
-using TEntries = std::vector<SFileData_t>;
-
-// Orders the entries of one folder as their whole paths are ordered. All begin with the same text,
-// which need not be compared.
-class SFileDataComparator {
-  public:
-    explicit SFileDataComparator(std::size_t common) : common_(common) {}
-
-    bool operator()(SFileData_t const& left, SFileData_t const& right) const {
-        std::string const& other = right.path.native();
-        return left.path.native().compare(common_, std::string::npos, other, common_,
-                                          std::string::npos) < 0;
-    }
-
-  private:
-    std::size_t common_;
+// Entries of one folder that are all of one kind.
+struct SWaiting {
+    CDirSiblings entries;
+    bool areFolders;
 };
 
 // What the paths of a folder's entries begin with.
-std::string prefixOf(boost::filesystem::path const& folder) {
-    std::string prefix = folder.native();
-    if (prefix.back() != '/')
-        prefix += '/';
-    return prefix;
+std::string prefixOf(std::string const& folder) {
+    return folder.back() == '/' ? folder : folder + '/';
 }
 
 } // namespace
@@ -72,9 +47,7 @@ class CDirIterator::Impl_ {
     bool empty() const { return pending_.empty(); }
 
     // The front entry as a specification.
-    void setCurrent(CFileSpec& current) const {
-        current = CFileSpec(pending_.front().path.native());
-    }
+    void setCurrent(CFileSpec& current) { pending_.front().entries.getFileSpec(current); }
 
     // False at the end.
     bool next() {
@@ -87,8 +60,8 @@ class CDirIterator::Impl_ {
   private:
     // Folders are listed and fetched from in one loop: if each listing fetched the next entry by
     // itself, a long row of empty folders would take a frame of the stack each.
-    bool scan_(boost::filesystem::path const& folder) {
-        list_(folder);
+    bool scan_(std::string const& folder) {
+        list_(folder, 0);
         return fetch_first_consumable_();
     }
 
@@ -99,68 +72,87 @@ class CDirIterator::Impl_ {
     }
 
     void leaveFront_() {
-        SFileData_t const front = std::move(pending_.front());
-        pending_.pop_front();
-        if (recursive_ == eRecursive && front.is_directory())
-            list_(front.path);
+        SWaiting const& front = pending_.front();
+        if (recursive_ != eRecursive || !front.areFolders) {
+            dropFront_();
+            return;
+        }
+        std::string const folder = front.entries.path();
+        unsigned int const links = front.entries.links();
+        dropFront_();
+        list_(folder, links);
+    }
+
+    void dropFront_() {
+        CDirSiblings& entries = pending_.front().entries;
+        entries.pop();
+        if (entries.empty())
+            pending_.pop_front();
     }
 
     // Files passed the filter when they were listed.
-    bool isConsumable_(SFileData_t const& entry) const {
-        if (delivers_(eFolders) && entry.is_directory())
-            return extension_.empty() || entry_matches_extension_(entry.path);
-        return delivers_(eFiles) && entry.is_file();
+    bool isConsumable_(SWaiting const& front) const {
+        if (delivers_(eFolders) && front.areFolders)
+            return extension_.empty() || entry_matches_extension_(front.entries.name());
+        return delivers_(eFiles) && !front.areFolders;
     }
 
-    void list_(boost::filesystem::path const& folder) {
-        TEntries files;
-        TEntries folders;
-        read_(folder, files, folders);
-        SFileDataComparator const comparator(folder.size());
-        std::sort(files.begin(), files.end(), comparator);
-        std::sort(folders.begin(), folders.end(), comparator);
-        pending_.insert(pending_.begin(), std::make_move_iterator(files.begin()),
-                        std::make_move_iterator(files.end()));
-        pending_.insert(pending_.end(), std::make_move_iterator(folders.begin()),
-                        std::make_move_iterator(folders.end()));
-    }
-
-    // What was found before a failure counts. The listing moves on before an entry is looked at, so
-    // that the entry whose successor can't be read is lost with it.
-    void read_(boost::filesystem::path const& folder, TEntries& files, TEntries& folders) const {
+    void list_(std::string const& folder, unsigned int links) {
         std::string const prefix = prefixOf(folder);
+        SWaiting files = {CDirSiblings(prefix, links), false};
+        SWaiting folders = {CDirSiblings(prefix, links), true};
         try {
-            CDirListing listing(folder.native());
-            for (bool isThere = listing.next(); isThere;) {
-                boost::filesystem::file_type const type = listing.type();
-                SFileData_t data = {prefix + listing.name(), boost::filesystem::file_status(type)};
-                isThere = listing.next();
-                if (type == boost::filesystem::status_error)
-                    data.status = boost::filesystem::status(data.path);
-                sortIn_(std::move(data), files, folders);
-            }
+            read_(CDirListing(folder, links, reach_), prefix, files.entries, folders.entries);
         } catch (std::exception const&) {
+            // What was found before a failure counts.
+        }
+        files.entries.sort();
+        folders.entries.sort();
+        if (!files.entries.empty())
+            pending_.push_front(std::move(files));
+        if (!folders.entries.empty())
+            pending_.push_back(std::move(folders));
+    }
+
+    // The listing moves on before an entry is looked at, so that the entry whose successor can't be
+    // read is lost with it.
+    void read_(CDirListing&& listing, std::string const& prefix, CDirSiblings& files,
+               CDirSiblings& folders) const {
+        std::string name;
+        for (bool isThere = listing.next(); isThere;) {
+            CDirListing::SKind kind = listing.kind();
+            name = listing.name();
+            isThere = listing.next();
+            if (kind.type == boost::filesystem::status_error)
+                kind = listing.askKind(prefix + name, kind);
+            if (wantsFolder_(kind))
+                folders.add(name, kind.isLink);
+            else if (wantsFile_(kind, name))
+                files.add(name, kind.isLink);
         }
     }
 
-    void sortIn_(SFileData_t&& data, TEntries& files, TEntries& folders) const {
-        bool const wantsFolders = recursive_ != eNotRecursive || delivers_(eFolders);
-        if (wantsFolders && data.is_directory())
-            folders.push_back(std::move(data));
-        else if (delivers_(eFiles) && data.is_file() &&
-                 (extension_.empty() || entry_matches_extension_(data.path)))
-            files.push_back(std::move(data));
+    bool wantsFolder_(CDirListing::SKind const& kind) const {
+        return kind.type == boost::filesystem::directory_file &&
+               (recursive_ != eNotRecursive || delivers_(eFolders));
     }
 
-    bool entry_matches_extension_(boost::filesystem::path const& path) const {
-        boost::filesystem::path const extension = path.extension();
+    bool wantsFile_(CDirListing::SKind const& kind, std::string const& name) const {
+        return kind.type == boost::filesystem::regular_file && delivers_(eFiles) &&
+               (extension_.empty() || entry_matches_extension_(name));
+    }
+
+    bool entry_matches_extension_(std::string_view name) const {
+        boost::filesystem::path const extension =
+            boost::filesystem::path(name.begin(), name.end()).extension();
         return !extension.empty() &&
                Encoding::convert<Strings::string>(extension.native()) == dottedExtension_;
     }
 
     bool delivers_(EFlags kind) const { return (flags_ & kind) != 0; }
 
-    std::deque<SFileData_t> pending_;
+    std::deque<SWaiting> pending_; // none of them empty
+    CDirReach reach_;
     CFileSpec root_;
     Strings::string extension_;
     Strings::string dottedExtension_;

@@ -129,11 +129,11 @@ Strings::string CFileSpec::getForbiddenChars() {
 }
 
 bool operator==(CFileSpec const& left, CFileSpec const& right) {
-    return left.getFullName(false) == right.getFullName(false);
+    return left.path_ == right.path_;
 }
 
 bool operator<(CFileSpec const& left, CFileSpec const& right) {
-    return left.getFullName(false) < right.getFullName(false);
+    return left.path_ < right.path_;
 }
 
 CFileSpec operator+(CFileSpec left, Strings::string const& right) {
