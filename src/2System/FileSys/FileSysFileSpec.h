@@ -17,6 +17,11 @@
 namespace FileSys {
 
 class CFileInfo;
+class CFileSpec;
+
+namespace Detail {
+std::string toSystemText(CFileSpec const& spec);
+}
 
 /// One path text, kept unit for unit as the caller gave it. Nothing is resolved, normalised or
 /// looked up on a disk but where a member says so: every other operation is a search in the text
@@ -163,6 +168,7 @@ class CFileSpec {
     static Strings::string getForbiddenChars();
 
   private:
+    friend std::string Detail::toSystemText(CFileSpec const& spec);
     friend bool operator==(CFileSpec const& left, CFileSpec const& right);
     friend bool operator<(CFileSpec const& left, CFileSpec const& right);
 

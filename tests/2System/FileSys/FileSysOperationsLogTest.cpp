@@ -103,7 +103,7 @@ TEST_F(CFileLogTest, AMoveThatFailsSaysNothing) {
 
 TEST_F(CFileLogTest, AMoveThatBecomesACopy) {
     askInstead = [] { ERROR_THROW(FileSys::Detail::TExcOSFile, Error::msgAccessConflict); };
-    FileSys::moveFile(path("from"), path("to"), false);
+    FileSys::moveFile(path("from"), path("x/to"), false);
     CLogRecord const record = line();
     ASSERT_EQ(record.parameters.size(), 4U);
     Strings::string const failure = record.parameters[2].second;
@@ -114,10 +114,10 @@ TEST_F(CFileLogTest, AMoveThatBecomesACopy) {
     EXPECT_EQ(failure.back(), L' ');
     expectLine(record, "moveOrCopy",
                L"Cannot move \"@(from)\" to \"@(to)\": (@(oss.str())). Trying to copy and delete.",
-               {{"from", wide(path("from"))}, {"to", wide(path("to"))}, {"oss.str()", failure}},
-               L"Cannot move \"" + wide(path("from")) + L"\" to \"" + wide(path("to")) + L"\": (" +
-                   failure + L"). Trying to copy and delete.");
-    EXPECT_EQ(TestSupport::listTree(path()), std::vector<std::string>{"to"});
+               {{"from", wide(path("from"))}, {"to", wide(path("x/to"))}, {"oss.str()", failure}},
+               L"Cannot move \"" + wide(path("from")) + L"\" to \"" + wide(path("x/to")) +
+                   L"\": (" + failure + L"). Trying to copy and delete.");
+    EXPECT_EQ(TestSupport::listTree(path()), (std::vector<std::string>{"x", "x/to"}));
 }
 
 TEST_F(CFileLogTest, ARenameSpeaksToTheDebugger) {

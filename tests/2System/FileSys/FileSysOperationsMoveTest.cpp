@@ -430,8 +430,9 @@ TEST_F(CMoveHandlerTest, ACopyThatFailsThereLeavesTheSourceWhole) {
 TEST_F(CMoveHandlerTest, AnyOtherFailurePasses) {
     askInstead = [] { ERROR_THROW(FileSys::TExcFileSysOp, Error::msgAccessConflict); };
     EXPECT_EQ(failureOf([&] { move("tree", "x/to", false); }).name, "FileSysOp");
+    // It stands in a question that only a folder brings which has to be made.
     askInstead = [] { ERROR_THROW(FileSys::TExcFileSpec, Error::msgAccessConflict); };
-    EXPECT_EQ(failureOf([&] { move("tree", "x/to", false); }).name, "FileSpec");
+    EXPECT_EQ(failureOf([&] { move("tree", "y/to", false); }).name, "FileSpec");
     EXPECT_EQ(listTree(path("tree")), (TNames{"a", "sub", "sub/b"}));
 }
 

@@ -4,6 +4,7 @@
 #include "1Base/Error/ErrorMacros.h"
 #include "2System/FileSys/FileSysFileInfo.h"
 #include "2System/FileSys/_Imp/FileSysFileSpecExc.h"
+#include "2System/FileSys/_Imp/FileSysSystemPath.h"
 
 #include <boost/filesystem/operations.hpp>
 #include <boost/filesystem/path.hpp>
@@ -17,10 +18,12 @@
 namespace FileSys {
 namespace {
 
+using Detail::askType;
+
 // Empty, which names nothing, where the text has no UTF-8 form: who asks wants no failure.
 boost::filesystem::path nativePath(CFileSpec const& spec) {
     try {
-        return spec.getFullName<std::string>(true);
+        return Detail::toSystemPath(spec);
     } catch (Encoding::TExcEncoding const&) {
         return boost::filesystem::path();
     }
@@ -29,13 +32,11 @@ boost::filesystem::path nativePath(CFileSpec const& spec) {
 } // namespace
 
 bool CFileSpec::exists() const {
-    boost::system::error_code error;
-    return boost::filesystem::exists(nativePath(*this), error) && !error;
+    return boost::filesystem::exists(boost::filesystem::file_status(askType(*this)));
 }
 
 bool CFileSpec::isFolder() const {
-    boost::system::error_code error;
-    return boost::filesystem::is_directory(nativePath(*this), error) && !error;
+    return askType(*this) == boost::filesystem::directory_file;
 }
 
 unsigned long long CFileSpec::getFileSize() const {

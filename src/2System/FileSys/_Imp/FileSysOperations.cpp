@@ -17,6 +17,9 @@ using Detail::toSystemPath;
 
 void doCreateFolder(CFileSpec const& folder) {
     ERROR_BLOCK_BEGIN
+    // One question where the path library asks twice: a copy of a tree comes here for each file.
+    if (folder.isFolder())
+        return;
     boost::filesystem::path const path = toSystemPath(folder);
     boost::system::error_code error;
     boost::filesystem::create_directories(path, error);
@@ -68,7 +71,7 @@ bool doCanOpen(CFileSpec const& spec, unsigned int mode) {
 
 bool doCanRead(CFileSpec const& spec) {
     ERROR_BLOCK_BEGIN
-    return access(spec.getFullName<std::string>(true).c_str(), R_OK) == 0;
+    return access(Detail::toSystemText(spec).c_str(), R_OK) == 0;
     ERROR_BLOCK_END
 }
 

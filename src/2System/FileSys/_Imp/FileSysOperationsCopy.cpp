@@ -17,6 +17,10 @@ boost::system::error_code systemError(int error) {
 }
 
 // Opening a FIFO or a device can wait for its other end.
+bool canWaitOnOpening(boost::filesystem::file_type type) {
+    return type == boost::filesystem::fifo_file || type == boost::filesystem::character_file;
+}
+
 bool canWaitOnOpening(struct stat const& status) {
     return S_ISFIFO(status.st_mode) || S_ISCHR(status.st_mode);
 }
@@ -28,16 +32,11 @@ bool isSameFile(struct stat const& left, struct stat const& right) {
 // What the path library finds out too late: it waits for the other end of a FIFO before it refuses
 // it, and empties a file that it overwrites before it sees that this is the source under another
 // name. The errors are the library's own, and all else is left to it.
-boost::system::error_code checkCopying(std::string const& from, std::string const& to,
-                                       bool overwrite) {
+boost::system::error_code checkOverwriting(std::string const& from, std::string const& to) {
     struct stat source;
     struct stat target;
     if (stat(from.c_str(), &source) != 0)
         return systemError(errno);
-    if (canWaitOnOpening(source))
-        return systemError(ENOSYS);
-    if (!overwrite)
-        return systemError(0);
     if (stat(to.c_str(), &target) != 0)
         return systemError(errno == ENOENT ? 0 : errno);
     if (canWaitOnOpening(target))
@@ -45,11 +44,16 @@ boost::system::error_code checkCopying(std::string const& from, std::string cons
     return systemError(isSameFile(source, target) ? EEXIST : 0);
 }
 
-boost::system::error_code copyContent(CFileSpec const& from, CFileSpec const& to, bool overwrite) {
+boost::system::error_code copyContent(CFileSpec const& from, boost::filesystem::file_type type,
+                                      CFileSpec const& to, bool overwrite) {
     using boost::filesystem::copy_options;
     boost::filesystem::path const source = Detail::toSystemPath(from);
     boost::filesystem::path const target = Detail::toSystemPath(to);
-    boost::system::error_code error = checkCopying(source.native(), target.native(), overwrite);
+    boost::system::error_code error;
+    if (canWaitOnOpening(type))
+        error = systemError(ENOSYS);
+    else if (overwrite)
+        error = checkOverwriting(source.native(), target.native());
     if (!error)
         boost::filesystem::copy_file(
             source, target, overwrite ? copy_options::overwrite_existing : copy_options::none,
@@ -70,14 +74,15 @@ void doCopyFolder(CFileSpec const& from, CFileSpec const& to, bool overwrite) {
 
 } // namespace
 
-void Detail::doCopyFile(CFileSpec const& from, CFileSpec const& to, bool overwrite) {
+void Detail::doCopyFile(CFileSpec const& from, boost::filesystem::file_type type,
+                        CFileSpec const& to, bool overwrite) {
     ERROR_BLOCK_BEGIN
     if (!overwrite && to.exists()) {
         ERROR_LOG(TLoggerFileSys, Error::TTgtLogger, Error::TSevDebug,
                   "Copied file \"@(to)\" already exists.", ERROR_PARAM(to));
         return;
     }
-    if (boost::system::error_code const error = copyContent(from, to, overwrite))
+    if (boost::system::error_code const error = copyContent(from, type, to, overwrite))
         ERROR_THROW(TExcFileSpec, Error::msgCouldNot,
                     couldNot("copy", "file", keyOf(from, to), reasonOf(error)));
     ERROR_BLOCK_END
@@ -87,7 +92,8 @@ void copyFile(CFileSpec const& from, CFileSpec const& to, bool overwrite) {
     ERROR_BLOCK_BEGIN
     if (from == to)
         return;
-    if (from.isFolder()) {
+    boost::filesystem::file_type const type = Detail::askType(from);
+    if (type == boost::filesystem::directory_file) {
         createFolder(to);
         doCopyFolder(from, to, overwrite);
         return;
@@ -95,7 +101,7 @@ void copyFile(CFileSpec const& from, CFileSpec const& to, bool overwrite) {
     CFileSpec const folder = to.getParentFolder();
     if (!folder.empty())
         createFolder(folder);
-    Detail::doCopyFile(from, to, overwrite);
+    Detail::doCopyFile(from, type, to, overwrite);
     ERROR_BLOCK_END
 }
 

@@ -6,8 +6,8 @@
 #include "1Base/Strings/StringsParameterList.h"
 #include "2System/FileSys/FileSysExc.h"
 #include "2System/FileSys/FileSysFileSpec.h"
+#include "2System/FileSys/_Imp/FileSysSystemPath.h"
 
-#include <boost/filesystem/path.hpp>
 #include <boost/system/error_code.hpp>
 
 #include <string>
@@ -23,12 +23,6 @@ TEMPLMETA_TAG_NAME(OSFile);
 /// moveFile() has to know them all.
 using TExcOSFile =
     Error::TExc<TemplMeta::CTag<CTag_Name_OSFile<char const*>>, TExcFileSysOp, TExcFileSpec>;
-
-/// The path as the operating system takes it. Never made from wide text, which would go by the C
-/// locale.
-inline boost::filesystem::path toSystemPath(CFileSpec const& spec) {
-    return boost::filesystem::path(spec.getFullName<std::string>(true));
-}
 
 /// The system's text of a failure; empty where there was none, which the library calls "Success".
 inline std::string reasonOf(boost::system::error_code const& error) {
@@ -54,8 +48,9 @@ inline Strings::CParameterList<wchar_t> wrongArgument(CFileSpec const& key, char
     return ERROR_PARAMS(ERROR_PARAM(type), ERROR_PARAM(key), ERROR_PARAM(reason));
 }
 
-/// Copies one file. Where `to` exists and `overwrite` is false nothing happens.
-void doCopyFile(CFileSpec const& from, CFileSpec const& to, bool overwrite);
+/// Copies one file, which is of `type`. Where `to` exists and `overwrite` is false nothing happens.
+void doCopyFile(CFileSpec const& from, boost::filesystem::file_type type, CFileSpec const& to,
+                bool overwrite);
 
 } // namespace Detail
 } // namespace FileSys

@@ -16,7 +16,7 @@ void doMoveFile(CFileSpec const& from, CFileSpec const& to) {
     boost::filesystem::rename(Detail::toSystemPath(from), Detail::toSystemPath(to), error);
     if (error.value() == EXDEV) {
         // For one file: a folder is refused, and stays.
-        Detail::doCopyFile(from, to, true);
+        Detail::doCopyFile(from, Detail::askType(from), to, true);
         deleteFile(from, true);
     } else if (error) {
         ERROR_THROW(

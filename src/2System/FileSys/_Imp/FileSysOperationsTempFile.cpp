@@ -85,7 +85,7 @@ CFileSpec doCreateTempFile(CFileSpec const& fs) {
     CFileSpec const folder = isFolder ? fs : findFolderOrTemporary(fs.getParentFolder());
     [[maybe_unused]] Strings::string const prefix =
         formPrefix(useHint ? fs.getFile() : Strings::string(L"ZLT"));
-    CUniquePath path(folder.getFullName<std::string>(true) + "/XXXXXX");
+    CUniquePath path(Detail::toSystemText(folder) + "/XXXXXX");
     errno = 0;
     int const descriptor = mkstemp(path.data());
     // mkstemp leaves the owner alone with the file, and the mask has no say here.
@@ -103,7 +103,7 @@ CFileSpec doCreateTempFile(CFileSpec const& fs) {
 CFileSpec doCreateTempFolder(CFileSpec const& fs) {
     ERROR_BLOCK_BEGIN
     CFileSpec const named = findFolderOrTemporary(fs.getParentFolder()) + fs.getFile();
-    CUniquePath path(named.getFullName<std::string>(true) + "-XXXXXX");
+    CUniquePath path(Detail::toSystemText(named) + "-XXXXXX");
     errno = 0;
     if (mkdtemp(path.data()) == nullptr)
         ERROR_THROW(Detail::TExcOSFile, Error::msgOSCallArgs, refusedCall("mkdtemp", path));
