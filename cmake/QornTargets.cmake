@@ -1,6 +1,7 @@
 # How a target of this project is made: language level, warnings, visibility, sanitizers.
 
 include_guard(GLOBAL)
+include(QornReproducible)
 
 set(CMAKE_CXX_VISIBILITY_PRESET hidden)
 set(CMAKE_OBJCXX_VISIBILITY_PRESET hidden)
@@ -36,5 +37,6 @@ function(qorn_add_floor name)
   add_library(qorn::${name} ALIAS qorn_${name})
   target_compile_features(qorn_${name} PUBLIC cxx_std_17)
   target_include_directories(qorn_${name} PUBLIC $<BUILD_INTERFACE:${PROJECT_SOURCE_DIR}/src>)
-  target_link_libraries(qorn_${name} PRIVATE $<BUILD_INTERFACE:qorn_build_options>)
+  target_link_libraries(qorn_${name} PRIVATE
+    $<BUILD_INTERFACE:qorn_reproducible_options> $<BUILD_INTERFACE:qorn_build_options>)
 endfunction()
