@@ -116,7 +116,7 @@ configure() {
 # Writes all commands of the build, one a line and without quotes, to a file that `commands` names.
 list_commands() {
   commands=$work/commands
-  ninja -C "$build" -t commands | tr -d '"\\' >"$commands"
+  ninja -C "$build" -t commands | tr -d '"\134' >"$commands"
 }
 
 # command_with <text>...: prints the one command that holds all of the texts.
