@@ -1,12 +1,13 @@
-# qorn_add_test(<name> [LINUX] SOURCES ... LIBRARIES ... [WRAP ...] [LABELS ...])
+# qorn_add_test(<name> [SOURCES ...] [LINUX ...] [LIBRARIES ...] [WRAP ...] [LABELS ...])
 #
 # A test program of GoogleTest. Each of its tests becomes a CTest test in a process of its own, so
 # that caches and singletons start fresh. WRAP names functions of other units that the program puts
 # its own `__wrap_` versions in front of at link time.
 #
-# LINUX marks a test of Linux: what it tests is there alone, or one of its LIBRARIES puts functions
-# in front of others as WRAP does, which the linker of macOS can't. Elsewhere it counts as skipped,
-# and so does every test with WRAP. Tests that need more than a line each stand in `if(NOT APPLE)`.
+# LINUX takes the sources that need Linux: for what they test, or since WRAP or one of the LIBRARIES
+# puts functions in front of others for them, which the linker of macOS can't. There the program is
+# made of SOURCES alone, and the others count as one skipped test. What needs more than a source to
+# be left out stands in `if(NOT APPLE)`.
 
 include_guard(GLOBAL)
 include(GoogleTest)
@@ -33,12 +34,20 @@ function(qorn_add_skipped_test name reason)
 endfunction()
 
 function(qorn_add_test name)
-  cmake_parse_arguments(PARSE_ARGV 1 arg "LINUX" "" "SOURCES;LIBRARIES;WRAP;LABELS")
-  if(APPLE AND (arg_LINUX OR arg_WRAP))
-    qorn_add_skipped_test(${name} "a test of Linux alone")
-    return()
+  cmake_parse_arguments(PARSE_ARGV 1 arg "" "" "SOURCES;LINUX;LIBRARIES;WRAP;LABELS")
+  if(APPLE)
+    if(arg_LINUX)
+      qorn_add_skipped_test(${name}.Linux "these tests are Linux's alone")
+    elseif(arg_WRAP)
+      message(FATAL_ERROR "${name}: the sources that need WRAP belong behind LINUX")
+    endif()
+    set(arg_LINUX)
+    set(arg_WRAP)
+    if(NOT arg_SOURCES)
+      return()
+    endif()
   endif()
-  add_executable(${name} ${arg_SOURCES})
+  add_executable(${name} ${arg_SOURCES} ${arg_LINUX})
   if(QORN_SANITIZE)
     target_sources(${name} PRIVATE ${PROJECT_SOURCE_DIR}/tests/support/SanitizerOptions.cpp)
   endif()

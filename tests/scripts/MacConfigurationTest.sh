@@ -93,6 +93,17 @@ check_nothing_of_linux() {
   [ -z "$found" ] || fail "of Linux: $found"
 }
 
+# No test is built that has something put in front of something else.
+check_tests() {
+  local source count=0
+  while IFS= read -r source; do
+    ! grep -qE '__wrap_|__real_|PlatformCalls\.h' -- "$root/$source" || fail "is built: $source"
+    count=$((count + 1))
+  done < <(grep -oE -e ' -o tests/[^ ]*\.o ' "$commands" |
+    sed -E 's, -o (.*)CMakeFiles/[^/]*/(.*)\.o ,\1\2,; s,/__,/..,g')
+  [ "$count" -gt 50 ] || fail "only $count sources of tests are built"
+}
+
 check_all() {
   check_every_command "$both_processors"
   check_every_command " -mmacosx-version-min=10.15 "
@@ -102,6 +113,7 @@ check_all() {
   check_all_frameworks
   check_java
   check_nothing_of_linux
+  check_tests
 }
 
 TheProjectIsBuiltForBothProcessors() {
@@ -143,13 +155,18 @@ EachMistakeIsNoticed() {
   expect_noticed '/EncryptTest/s/$/ -lqorn_test_platform_calls/'
   expect_noticed '/EncryptTest/s/$/ -Wl,--wrap=CFRelease/'
   expect_noticed '/jnilib/s/$/ -Wl,-z,now/'
+  expect_noticed 's,EncodingLatin1Test\.cpp\.o ,EncodingConverterTest.cpp.o ,g'
+  expect_noticed '/ -o tests.*\.o /d'
 }
 
 TestsOfLinuxCountAsSkipped() {
   mac arm64 /opt/homebrew
   configure_project
-  expect_success ctest --test-dir "$build" -R '^(EncodingTest|ErrorAssertTest)$'
+  expect_success ctest --test-dir "$build" -R '^(EncodingTest|ErrorAssertTest)\.Linux$'
   [ "$(grep -c '\*\*\*Skipped' <<<"$output")" -eq 2 ] || fail "not skipped"
+  list_commands
+  [ -n "$(command_with EncodingLatin1Test.cpp.o " -c ")" ] || fail "too much is left out"
+  ! grep -F -e EncodingConverterTest.cpp -e StreamsBufferTest.cpp "$commands" || fail "built there"
 }
 
 TheMachinesProcessorIsTheDefault() {
