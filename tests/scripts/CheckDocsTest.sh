@@ -176,6 +176,17 @@ APageThatNobodyLinksFails() {
   rejects "docs/lonely.md: no link in README.md leads there"
 }
 
+AFileThatIsNamedAndNotThereFails() {
+  project_with_header </dev/null
+  add_file docs/other.md <<'END'
+# Another
+
+See `src/1Base/A`, `src/1Base/A/A.h`, `src/1Base/*/_Imp` and `src/1Base/A/B.h`.
+END
+  rejects "docs/other.md:3: names src/1Base/A/B.h, which there is not"
+  expect_not_said "A.h, which"
+}
+
 APictureThatIsMissingFails() {
   project_with_header </dev/null
   add_file docs/other.md <<'END'
