@@ -61,6 +61,10 @@ inline std::string valueOf(CPreferenceFolder const& store, std::string const& pa
     return std::string(value.begin(), value.end());
 }
 
+/// Around the piece of 1024 bytes in which a value is read, and far beyond it. Written one over the
+/// other they become longer and shorter.
+inline constexpr std::size_t valueSizes[] = {1, 0, 1023, 1024, 10000000, 1025, 2047, 2048, 2049, 0};
+
 /// Every byte value, in an order that shows which piece of it was lost.
 inline std::string binaryContent(std::size_t size) {
     std::string content(size, '\0');

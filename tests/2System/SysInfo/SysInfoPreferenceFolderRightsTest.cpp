@@ -146,6 +146,20 @@ TEST_F(CPrivilegedPreferenceTest, TheTemporaryFileIsCompleteWhenItIsMoved) {
     umask(mask);
 }
 
+TEST_F(CPrivilegedPreferenceTest, AValueOfAnySizeIsWholeWhenItIsMovedAndBehindIt) {
+    CPreferenceFolder target = store();
+    for (std::size_t const size : valueSizes) {
+        std::string const content = binaryContent(size);
+        bool wasWhole = false;
+        authorization.onExecute = [&] { wasWhole = readFile(temporary()) == content; };
+        target.setValue(at(""), "key", bytes(content));
+        EXPECT_TRUE(wasWhole) << size;
+        EXPECT_TRUE(readFile(machine("/key")) == content) << size;
+        EXPECT_TRUE(valueOf(target, "", "key") == content) << size;
+        EXPECT_EQ(listTree(root().temporary()), TNames());
+    }
+}
+
 TEST_F(CPrivilegedPreferenceTest, TheValuesFileIsAnotherOneAfterwards) {
     CPreferenceFolder target = store();
     writeFile(machine("/key"), "old");

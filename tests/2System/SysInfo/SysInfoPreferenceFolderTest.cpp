@@ -134,7 +134,7 @@ TEST_F(CPlainPreferenceTest, TheRightChangesNothing) {
 
 TEST_F(CPlainPreferenceTest, AValueIsTheContentOfItsFile) {
     CPreferenceFolder store = userStore();
-    for (std::size_t const size : {0U, 1U, 1023U, 1024U, 1025U, 2047U, 2048U, 2049U, 10000000U}) {
+    for (std::size_t const size : valueSizes) {
         std::string const content = binaryContent(size);
         store.setValue(at("Window/Main"), "size", bytes(content));
         EXPECT_TRUE(readFile(user("/Window/Main/size")) == content) << size;

@@ -132,7 +132,6 @@ class CHelpedPreferenceTest : public CPreferenceFolderTest {
 
 TEST_F(CHelpedPreferenceTest, AProcessWithoutRightsWritesByTheHelpersTools) {
     CHelper helper;
-    std::string const large = binaryContent(3000000);
     runAsOrdinaryUser([&] {
         EXPECT_THROW(machineStore(), FileSys::TExcFileSpec);
         CPreferenceFolder plain = machineStore(nullptr, false);
@@ -141,9 +140,10 @@ TEST_F(CHelpedPreferenceTest, AProcessWithoutRightsWritesByTheHelpersTools) {
         CPreferenceFolder store = machineStore(&helper);
         EXPECT_TRUE(pathExists(machine()));
         EXPECT_THROW(plain.setValue(at(""), "key", bytes("value")), SysInfo::TExcPreferenceFolder);
-        for (std::string const& value : {std::string("first"), std::string(), large}) {
+        for (std::size_t const size : valueSizes) {
+            std::string const value = binaryContent(size);
             store.setValue(at("Window/a 'b' \xC3\xA9"), "the \"key\"", bytes(value));
-            EXPECT_TRUE(valueOf(store, "Window/a 'b' \xC3\xA9", "the \"key\"") == value);
+            EXPECT_TRUE(valueOf(store, "Window/a 'b' \xC3\xA9", "the \"key\"") == value) << size;
         }
         store.setValue(at(""), "-f", bytes("value"));
         EXPECT_EQ(store.getValues(), TNames{"-f"});

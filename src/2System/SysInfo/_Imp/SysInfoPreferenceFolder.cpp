@@ -136,13 +136,26 @@ TByteVector readToEnd(std::istream& stream) {
     return bytes;
 }
 
-template <class TString>
-std::vector<TString> fileNames(FileSys::CFileSpec const& folder) {
+// Each with a separator, which no name can hold, behind it.
+Strings::string joinedFileNames(FileSys::CFileSpec const& folder) {
     using Iterator = FileSys::CDirIterator;
     Iterator const end;
-    std::vector<TString> names;
+    Strings::string names;
     for (Iterator i(folder, Iterator::eNotRecursive, Iterator::eFiles); i != end; ++i)
-        names.push_back(Encoding::convert<TString>(i->getFile()));
+        names += i->getFile() + FileSys::CFileSpec::getPathSeparator();
+    return names;
+}
+
+// Converted at once: one by one a short name costs as much in conversions as in being listed.
+template <class TString>
+std::vector<TString> fileNames(FileSys::CFileSpec const& folder) {
+    TString const joined = Encoding::convert<TString>(joinedFileNames(folder));
+    std::vector<TString> names;
+    for (std::size_t begin = 0; begin < joined.size();) {
+        std::size_t const end = joined.find('/', begin);
+        names.push_back(joined.substr(begin, end - begin));
+        begin = end + 1;
+    }
     return names;
 }
 
