@@ -15,6 +15,7 @@
 #ifdef QORN_HAVE_QT
 #    include <QFileInfo>
 #    include <QString>
+#    include <QTemporaryDir>
 #    include <QTemporaryFile>
 #endif
 
@@ -143,6 +144,36 @@ void addTemporaryFile(std::string const& folder) {
 #endif
 }
 
+// A name of its own for the hint, and the folder removed again.
+void addTemporaryFolder(std::string const& folder) {
+    std::string const row = "TemporaryFolder";
+    std::string const name = folder + "/name";
+    FileSys::CFileSpec const hint(name);
+    Benchmarks::add(row, "ours", [hint] {
+        std::string const path = FileSys::createTempFolder(hint).getFullName<std::string>(true);
+        return rmdir(path.c_str());
+    });
+    Benchmarks::add(row, "mkdtemp", [name] {
+        std::string path = name + "-XXXXXX";
+        mkdtemp(path.data());
+        return rmdir(path.c_str());
+    });
+#ifdef QORN_HAVE_QT
+    QString const pattern = QString::fromStdString(name + "-XXXXXX");
+    Benchmarks::add(row, "qt", [pattern] {
+        QTemporaryDir made(pattern);
+        return made.isValid();
+    });
+#endif
+#ifdef QORN_HAVE_GLIB
+    Benchmarks::add(row, "glib", [name] {
+        std::string path = name + "-XXXXXX";
+        g_mkdtemp(path.data());
+        return rmdir(path.c_str());
+    });
+#endif
+}
+
 void addBenchmarks() {
     addCopies("TreeCopy/20000x1KiB", Benchmarks::CTree("small", 200, 100, 1024));
     addCopies("TreeCopy/4x512MiB", Benchmarks::CTree("large", 1, 4, std::size_t(512) << 20));
@@ -151,6 +182,7 @@ void addBenchmarks() {
     addExists("missing", folder + "/none.txt");
     addIsFolder(folder);
     addTemporaryFile(folder);
+    addTemporaryFolder(folder);
 }
 
 Benchmarks::CRegistrar const registrar(addBenchmarks);

@@ -234,6 +234,40 @@ TEST_F(FileSysDirIteratorTest, ANameThatIsNotUtf8RaisesWhenItIsDelivered) {
     EXPECT_EQ(++iterator, CDirIterator());
 }
 
+// Names are decoded by the hundred.
+TEST_F(FileSysDirIteratorTest, EachNameThatIsNotUtf8RaisesAndNoOther) {
+    TNames names;
+    for (int i = 0; i < 1500; ++i) {
+        char const* const ends[] = {"", "\xC3\xA9", "\xF0\x9F\x98\x80", "\xEF\xBB\xBF"};
+        bool const isBad = i == 1 || i == 700 || i == 701 || i == 1499;
+        names.push_back(std::to_string(10000 + i) + (isBad ? "\xFF" : ends[i % 4]));
+    }
+    names.push_back("\xEF\xBB\xBFmark");
+    makeFiles(names);
+    CDirIterator iterator(spec(), deep, both);
+    for (std::string const& name : names) {
+        if (name.back() == '\xFF') {
+            EXPECT_THROW(++iterator, Encoding::TExcEncoding) << name;
+        } else {
+            if (name != names.front())
+                ++iterator;
+            ASSERT_EQ(*iterator, CFileSpec(path(name)));
+        }
+    }
+    EXPECT_EQ(++iterator, CDirIterator());
+}
+
+TEST_F(FileSysDirIteratorTest, ANameBelowOneThatIsNotUtf8Raises) {
+    makeAllFolders({"a", "b\xFF"});
+    makeFiles({"a/1", "a/2", "b\xFF/1", "b\xFF/2"});
+    CDirIterator iterator(spec(), deep, CDirIterator::eFiles);
+    EXPECT_EQ(*iterator, CFileSpec(path("a/1")));
+    EXPECT_EQ(*++iterator, CFileSpec(path("a/2")));
+    EXPECT_THROW(++iterator, Encoding::TExcEncoding);
+    EXPECT_THROW(++iterator, Encoding::TExcEncoding);
+    EXPECT_EQ(++iterator, CDirIterator());
+}
+
 TEST_F(FileSysDirIteratorTest, AFirstNameThatIsNotUtf8RaisesAtOnce) {
     makeFiles({"A\xFF", "a"});
     EXPECT_THROW(CDirIterator(spec(), deep, both), Encoding::TExcEncoding);

@@ -533,6 +533,19 @@ TEST_F(CPlainPreferenceTest, TheValuesOfTheStoresFolderAreListedInOrder) {
     EXPECT_EQ(store.getPaths(), wide);
 }
 
+TEST_F(CPlainPreferenceTest, ManyValuesAreListedWholly) {
+    CPreferenceFolder const store = userStore();
+    TNames keys;
+    std::vector<string> wide;
+    for (int i = 10000; i < 13000; ++i) {
+        keys.push_back(std::to_string(i) + "\xC3\xA9");
+        wide.push_back(std::to_wstring(i) + L'\u00E9');
+        writeFile(user("/" + keys.back()));
+    }
+    EXPECT_TRUE(store.getValues() == keys);
+    EXPECT_TRUE(store.getPaths() == wide);
+}
+
 TEST_F(CPlainPreferenceTest, FoldersAreNoPathsInALists) {
     CPreferenceFolder const store = userStore();
     makeFolders(user("/path/inner"));

@@ -11,6 +11,9 @@ namespace {
 // No name can hold it.
 constexpr char separator = '/';
 
+// As much as is decoded at once, in bytes: more would gain nothing.
+constexpr std::size_t enough = 4096;
+
 // Where the name ends whose separator stands at `begin`.
 template <class TText>
 std::size_t endOfName(TText const& text, std::size_t begin) {
@@ -63,7 +66,7 @@ std::string_view CDirSiblings::name() const {
 }
 
 void CDirSiblings::getFileSpec(CFileSpec& spec) {
-    if (!isDecoded_)
+    if (front_ >= decodedEnd_)
         decode_();
     if (wideNames_.empty()) {
         spec = CFileSpec(path());
@@ -74,16 +77,20 @@ void CDirSiblings::getFileSpec(CFileSpec& spec) {
     spec = path_;
 }
 
-// All that are left, unless it is only one. Nothing is raised here: the others of a name that is
-// not UTF-8 are as good as ever.
+// Nothing is raised here: a name that is not UTF-8 leaves those beside it as good as ever, each to
+// be decoded by itself. So does a single one.
 void CDirSiblings::decode_() {
-    isDecoded_ = true;
-    if (endOfName(names_, front_) == names_.size())
+    decodedEnd_ = endOfName(names_, std::min(front_ + enough, names_.size()));
+    wideNames_.clear();
+    wideFront_ = 0;
+    if (endOfName(names_, front_) == decodedEnd_)
         return;
-    path_ = decode(prefix_);
-    prefixLength_ = path_.size();
+    if (path_.empty()) {
+        path_ = decode(prefix_);
+        prefixLength_ = path_.size();
+    }
     if (!path_.empty())
-        wideNames_ = decode(names_.substr(front_));
+        wideNames_ = decode(names_.substr(front_, decodedEnd_ - front_));
 }
 
 } // namespace FileSys

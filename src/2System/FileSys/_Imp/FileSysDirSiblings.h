@@ -54,14 +54,14 @@ class CDirSiblings {
 
     std::string prefix_;
     unsigned int links_;
-    std::string names_;        // each behind a separator, from sort() on in order
-    std::vector<bool> isLink_; // of each
-    std::size_t front_ = 0;    // where the front one's separator stands
-    std::size_t number_ = 0;   // of the front one
-    bool isDecoded_ = false;
+    std::string names_;            // each behind a separator, from sort() on in order
+    std::vector<bool> isLink_;     // of each
+    std::size_t front_ = 0;        // where the front one's separator stands
+    std::size_t number_ = 0;       // of the front one
     Strings::string path_;         // the prefix in wide text, and some name behind it
     std::size_t prefixLength_ = 0; // of that prefix
-    Strings::string wideNames_;    // empty where a name or the prefix is not UTF-8
+    std::size_t decodedEnd_ = 0;   // how far decode_() has come
+    Strings::string wideNames_;    // from the front one to there, or empty
     std::size_t wideFront_ = 0;
 };
 

@@ -136,25 +136,32 @@ TByteVector readToEnd(std::istream& stream) {
     return bytes;
 }
 
-// Each with a separator, which no name can hold, behind it.
-Strings::string joinedFileNames(FileSys::CFileSpec const& folder) {
-    using Iterator = FileSys::CDirIterator;
-    Iterator const end;
-    Strings::string names;
-    for (Iterator i(folder, Iterator::eNotRecursive, Iterator::eFiles); i != end; ++i)
-        names += i->getFile() + FileSys::CFileSpec::getPathSeparator();
-    return names;
-}
-
-// Converted at once: one by one a short name costs as much in conversions as in being listed.
+// Appends the names out of a text in which a separator, which no name can hold, stands behind each.
 template <class TString>
-std::vector<TString> fileNames(FileSys::CFileSpec const& folder) {
-    TString const joined = Encoding::convert<TString>(joinedFileNames(folder));
-    std::vector<TString> names;
+void takeApart(TString const& joined, std::vector<TString>& names) {
     for (std::size_t begin = 0; begin < joined.size();) {
         std::size_t const end = joined.find('/', begin);
         names.push_back(joined.substr(begin, end - begin));
         begin = end + 1;
+    }
+}
+
+// Converted by the hundred: a conversion of each costs as much as to list and to sort it.
+template <class TString>
+std::vector<TString> fileNames(FileSys::CFileSpec const& folder) {
+    using Iterator = FileSys::CDirIterator;
+    constexpr std::size_t enough = 4096;
+    Iterator const end;
+    std::vector<TString> names;
+    Strings::string joined;
+    for (Iterator i(folder, Iterator::eNotRecursive, Iterator::eFiles); i != end;) {
+        joined += i->getFile();
+        joined += FileSys::CFileSpec::getPathSeparator();
+        ++i;
+        if (joined.size() < enough && i != end)
+            continue;
+        takeApart<TString>(Encoding::convert<TString>(joined), names);
+        joined.clear();
     }
     return names;
 }
