@@ -22,7 +22,8 @@ namespace FileSys {
 /// When a folder is opened its files go, sorted, in front of all that is waiting, and its sub
 /// folders, sorted, behind it. The walk asks the disk once an entry and reads one folder at a time;
 /// what was found is delivered even if it has gone since. A folder that can't be listed ends where
-/// its listing failed, and nothing is reported. A name that is not UTF-8 raises TExcEncoding when
+/// its listing failed, and nothing is reported. Folders below the root may have longer paths than a
+/// call of the system takes. A name that is not UTF-8 raises TExcEncoding when
 /// it is delivered, and the walk may go on behind it; under a filter an extension that is not UTF-8
 /// raises when its folder is opened.
 ///
