@@ -12,10 +12,7 @@ set(CPACK_COMPONENTS_ALL development)
 if(QORN_BUILD_BRIDGE)
   list(APPEND CPACK_COMPONENTS_ALL library)
 endif()
-# Whatever the builder's umask.
-set(CPACK_INSTALL_DEFAULT_DIRECTORY_PERMISSIONS
-  OWNER_READ OWNER_WRITE OWNER_EXECUTE GROUP_READ GROUP_EXECUTE WORLD_READ WORLD_EXECUTE)
-set(CPACK_PRE_BUILD_SCRIPTS ${PROJECT_SOURCE_DIR}/cmake/QornPackageTimes.cmake)
+set(CPACK_PRE_BUILD_SCRIPTS ${PROJECT_SOURCE_DIR}/cmake/QornPackageTree.cmake)
 
 set(CPACK_DEB_COMPONENT_INSTALL ON)
 set(CPACK_DEBIAN_FILE_NAME DEB-DEFAULT)
@@ -33,9 +30,10 @@ set(CPACK_DEBIAN_DEVELOPMENT_PACKAGE_SECTION libdevel)
 string(CONCAT CPACK_DEBIAN_DEVELOPMENT_PACKAGE_DEPENDS
   "libboost${QORN_BOOST_VERSION}-dev, libboost-filesystem${QORN_BOOST_VERSION}-dev, "
   "libboost-thread${QORN_BOOST_VERSION}-dev, "
-  "libicu-dev (>= ${QORN_ICU_VERSION}), libicu-dev (<< ${QORN_ICU_NEXT_VERSION}~), libplist-dev (>= 2.2)")
+  "libicu-dev (>= ${QORN_ICU_VERSION}), libicu-dev (<< ${QORN_ICU_NEXT_VERSION}~), "
+  "libplist-dev (>= 2.2)")
 set(CPACK_COMPONENT_DEVELOPMENT_DESCRIPTION
-  "Headers and static libraries of the foundation in C++17 beneath the library, with the files by which
-CMake and pkg-config find them.")
+  "Headers and static libraries of the foundation in C++17 beneath the library, with the files
+by which CMake and pkg-config find them.")
 
 include(CPack)

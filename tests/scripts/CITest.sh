@@ -12,6 +12,7 @@ project_with_commands() {
   command_that run <<<'echo called'
   command_that scripts/check <<<'echo checked'
   command_that scripts/docs <<<'echo documented'
+  command_that scripts/reproduce <<<'echo reproduced'
   command_that scripts/check-headers <<<'echo "headers with $CXX"'
   command_that scripts/analyze <<<'echo analyzed'
 }

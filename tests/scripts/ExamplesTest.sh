@@ -4,16 +4,21 @@
 # shellcheck source=tests/scripts/support.sh
 source "$(dirname -- "${BASH_SOURCE[0]}")/support.sh"
 
-# expect_shown <language> <file>: the README shows the whole file and no other code of the language.
-expect_shown() {
-  output=$(diff -- "$root/$2" <(awk -v fence="\`\`\`$1" '
-    $0 == fence { inside = 1; next }
+# readme_block <language> [<number>]: the README's code in this language, or of this block of it.
+readme_block() {
+  awk -v fence="\`\`\`$1" -v number="${2:-0}" '
+    $0 == fence { ++count; inside = number == 0 || number == count; next }
     /^```/ { inside = 0 }
-    inside
-  ' "$root/README.md")) || fail "the README does not show $2"
+    inside' "$root/README.md"
+}
+
+# expect_shown <language> <file> [<number>]: the README shows the whole file and no other code.
+expect_shown() {
+  output=$(diff -- "$root/$2" <(readme_block "$1" "${3:-}")) || fail "the README does not show $2"
 }
 
 TheReadmeShowsTheExampleInCpp() { expect_shown cpp examples/cpp/FirstSteps.cpp; }
+TheReadmeShowsTheProjectThatFindsIt() { expect_shown cmake examples/package/CMakeLists.txt 2; }
 TheReadmeShowsTheExampleInJava() { expect_shown java examples/java/FirstSteps.java; }
 
 FirstStepsInCpp() {

@@ -5,11 +5,20 @@
 # shellcheck source=tests/scripts/support.sh
 source "$(dirname -- "${BASH_SOURCE[0]}")/support.sh"
 
-# Which test takes which block: the heading above it, its language, the test's name.
+# Which test takes which block: the heading above it, its language, the test's name, behind that of
+# its file where it is another.
 rules='Two commands|sh|TheCommandsAreThoseOfCI
 Calling it from Java|java|TheClassInJavaRuns
 Using the foundation from C++|cmake|TheProjectInCppRuns
-Using the foundation from C++|cpp|TheProjectInCppRuns'
+Using the foundation from C++|cpp|TheProjectInCppRuns
+Installing it|sh|DebianPackageTest.TheReadmesWayLeadsIntoAFolder
+Installing it|cmake|ExamplesTest.TheReadmeShowsTheProjectThatFindsIt
+Installing it|sh|DebianPackageTest.TheReadmesWayLeadsIntoAFolder
+Installing it|sh|DebianPackageTest.TheReadmesWayLeadsIntoAFolder
+Installing it|sh|DebianPackageTest.TheReadmesWayLeadsIntoAFolder
+Installing it|sh|DebianPackageTest.TheReadmesWayLeadsIntoAFolder
+Installing it|sh|DebianPackageTest.ThePackagesInstallAndAreRemovedCleanly
+Installing it|sh|DebianPackageTest.ThePackagesInstallAndAreRemovedCleanly'
 
 # list_blocks: a line for each block, with its heading and language. Indented code has the language
 # "indented", a fence that names none has "none".
@@ -39,12 +48,21 @@ block() {
   ' "$root/${3:-README.md}"
 }
 
+# has_test <case> | <file>.<case>
+has_test() {
+  if [[ $1 == *.* ]]; then
+    grep -q "^${1#*.}() {" "$root/tests/scripts/${1%.*}.sh"
+  else
+    [ "$(type -t -- "$1")" = function ]
+  fi
+}
+
 EveryBlockHasItsTest() {
   local heading language test
   output=$(diff <(list_blocks "$root/README.md") <(cut -d '|' -f 1,2 <<<"$rules")) ||
     fail "the blocks of the README (<) are not those of the rules (>)"
   while IFS='|' read -r heading language test; do
-    [ "$(type -t -- "$test")" = function ] || fail "there is no test $test"
+    has_test "$test" || fail "there is no test $test"
     [ -n "$(block "$heading" "$language")" ] || fail "nothing to take for $test"
   done <<<"$rules"
 }
@@ -156,6 +174,8 @@ TheProjectInCppRuns() {
   expect_success "$work/build/first_steps"
   [ "$output" = $'9\n/home/ada/Grüße.pdf' ] || fail "not what the comments say"
   [ -z "$(find "$work/build" -name '*Test' -o -name '*.jnilib')" ] || fail "built more than asked"
+  expect_success cmake --install "$work/build" --prefix "$work/installed"
+  [ ! -e "$work/installed" ] || fail "it installs what the project did not ask for"
 }
 
 run_case "$@"
