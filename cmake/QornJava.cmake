@@ -1,7 +1,7 @@
 # qorn_add_java(<name> [JAR <file>] SOURCES ...)
 #
-# The target <name> compiles Java sources into the folder java/<name> of the build, which it owns. JAR
-# packs them into java/<file>, whose manifest bears the project's version.
+# The target <name> compiles Java sources into the folder java/<name> of the build, which it owns.
+# JAR packs them into java/<file>, whose manifest bears the project's version.
 
 # Not GLOBAL: each folder that uses it needs the variable.
 include_guard()

@@ -1,9 +1,9 @@
 # qorn_configure_pkg_config(<component> <file>)
 #
-# Writes pkg-config's file of a floor, or of what bundles them, from what its target links. The floors
-# are archives: whoever links one needs at once all that it stands on, so that is public here, and
-# pkg-config's answer links with and without --static. What only Boost's archives need of each other
-# is private.
+# Writes pkg-config's file of a floor, or of what bundles them, from what its target links. The
+# floors are archives: whoever links one needs at once all that it stands on, so that is public here,
+# and pkg-config's answer links with and without --static. What only Boost's archives need of each
+# other is private.
 
 include_guard(GLOBAL)
 

@@ -14,9 +14,9 @@ foreach(folder IN ITEMS ${PROJECT_SOURCE_DIR} ${QORN_SOURCES_FROM_BUILD})
     $<$<NOT:$<CONFIG:Debug,RelWithDebInfo>>:-ffile-prefix-map=${folder}/=>)
 endforeach()
 
-# Origins hold the build's date and time too. clang 14 takes neither from the environment, and ccache
-# may be told to overlook both; on the command line they are seen by all. TIMESTAMP honours the same
-# variable.
+# Origins hold the build's date and time too. clang 14 takes neither from the environment, and
+# ccache may be told to overlook both; on the command line they are seen by all. TIMESTAMP honours
+# the same variable.
 if(DEFINED ENV{SOURCE_DATE_EPOCH})
   string(TIMESTAMP date "%b %d %Y" UTC)
   string(REPLACE " 0" "  " date ${date})

@@ -1,5 +1,5 @@
-# What is installed, as a stranger meets it: somebody else's project finds it, in C++ by CMake and by
-# pkg-config, and in Java. BUILD names the build's folder, JAVA and JAR two programs of Java.
+# What is installed, as a stranger meets it: somebody else's project finds it, in C++ by CMake and
+# by pkg-config, and in Java. BUILD names the build's folder, JAVA and JAR two programs of Java.
 # shellcheck shell=bash
 # shellcheck source=tests/scripts/package.sh
 source "$(dirname -- "${BASH_SOURCE[0]}")/package.sh"
