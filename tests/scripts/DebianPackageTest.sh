@@ -137,6 +137,11 @@ END
 
 # In a copy, as whoever has it cloned; into a folder whose name a shell does not split.
 TheReadmesWayLeadsIntoAFolder() {
+  if command -v ccache >/dev/null; then
+    # The copy of the next run lies elsewhere and is the same.
+    CCACHE_DIR=$(ccache --get-config cache_dir)
+    export CCACHE_DIR CCACHE_BASEDIR=$clone CCACHE_NOHASHDIR=1 CCACHE_SLOPPINESS=time_macros
+  fi
   mkdir -- "$clone"
   cp -r -- "$root"/{CMakeLists.txt,CMakePresets.json,cmake,examples,src} "$clone/"
   HOME=$(mktemp -d /tmp/qorn-home-XXXXXX)

@@ -88,4 +88,32 @@ ABuildThatMakesNothingFails() {
   expect_failure 1 "the build made no library and no package" "$root/scripts/reproduce" "$project"
 }
 
+# object_of <date>: compiles a unit that has origins, with this date for the build's, and sets `object`.
+object_of() {
+  local build="$work/$1" unit=src/2System/CMakeFiles/qorn_2system.dir/Modules/_Imp/ModulesDyLib.cpp.o
+  SOURCE_DATE_EPOCH=$(date --utc --date="$1 12:34:56" +%s)
+  export SOURCE_DATE_EPOCH
+  expect_success cmake -G Ninja -S "$root" -B "$build" \
+    -DQORN_BUILD_BRIDGE=OFF -DQORN_BUILD_EXAMPLES=OFF -DQORN_BUILD_TESTS=OFF
+  expect_success cmake --build "$build" --target "$unit"
+  object=$build/$unit
+}
+
+# Also where ccache is told that the time does not matter.
+TheLibrariesBearTheDateThatIsSet() {
+  export CCACHE_SLOPPINESS=time_macros
+  object_of 1970-01-02
+  expect_success grep -aqF 'Jan  2 1970' "$object"
+  object_of 1971-12-31
+  expect_success grep -aqF 'Dec 31 1971' "$object"
+  expect_success grep -aqF 12:34:56 "$object"
+}
+
+TheLibrariesDoNotNameTheFolder() {
+  local name=src/2System/Modules/_Imp/ModulesDyLib.cpp
+  object_of 1970-01-02
+  output=$(tr '\0' '\n' <"$object" | grep -aF "$name" | sort -u)
+  [ "$output" = "$name" ] || fail "the name of the file is not $name"
+}
+
 run_case "$@"
