@@ -88,7 +88,7 @@ check_java() {
 
 check_nothing_of_linux() {
   local found
-  found=$(grep -nE -e '0Platform|Linux' -e '-lqorn|-licu|libicu|plist|systemd|-ldl|-lpthread' \
+  found=$(grep -nE -e 'src/0Platform|Linux' -e '-lqorn|-licu|libicu|plist|systemd|-ldl|-lpthread' \
     -e '--wrap|version-script|-z[, ]|defsym|dynamic-symbol|new-dtags|static-lib' "$commands" || true)
   [ -z "$found" ] || fail "of Linux: $found"
 }
