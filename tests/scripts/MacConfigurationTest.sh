@@ -7,7 +7,6 @@ command -v clang++ >/dev/null || skip "there is no clang++"
 
 both_processors="-arch x86_64 -arch arm64"
 cocoa=src/1Base/CMakeFiles/qorn_1base.dir/BaseMacOS/_Imp/BaseMacOSCocoa.mm.o
-icon=src/2System/CMakeFiles/qorn_2system.dir/FileSys/_Imp/FileSysFileSpecIconMac.cpp.o
 bridge=src/QORNOpenOfficeLibrary/CMakeFiles/qorn_bridge_objects.dir/QORNOoLibrary_if.cpp.o
 product=lib/libQORNOpenOffice.jnilib
 
@@ -52,9 +51,7 @@ check_sources() {
 }
 
 check_cocoa() {
-  check_command "$cocoa" "-x objective-c++" -fno-objc-arc -std=gnu++17 -fvisibility=hidden \
-    -Wno-deprecated-declarations
-  check_command "$icon" -std=gnu++17 -Wno-deprecated-declarations
+  check_command "$cocoa" "-x objective-c++" -fno-objc-arc -std=gnu++17 -fvisibility=hidden
   [ "$(grep -cF objective-c++ "$commands")" -eq 1 ] || fail "other sources are Objective-C++"
 }
 
@@ -140,7 +137,6 @@ EachMistakeIsNoticed() {
   expect_noticed '1s/$/ -o src\/1Base\/CMakeFiles\/x\/BaseMacOSLinuxMail.cpp.o /'
   expect_noticed 's/-fno-objc-arc/-fobjc-arc/'
   expect_noticed '/Cocoa/s/gnu\+\+17/gnu++14/'
-  expect_noticed '/IconMac/s/-Wno-deprecated-declarations//'
   expect_noticed '/BaseMacOS\.cpp/s/ -c / -x objective-c++ -c /'
   expect_noticed 's/libQORNOpenOffice\.jnilib/libQORNOpenOffice.dylib/'
   expect_noticed 's/@rpath/\/tmp\/build/'
