@@ -49,6 +49,13 @@ ApplesCompilerNeedsNoPackage() {
   expect_brew_calls ""
 }
 
+APresetForLibcxxIsRefused() {
+  macos
+  expect_failure 1 "every preset uses libc++ on macOS" "$project/test" libcxx
+  expect_one_line
+  expect_brew_calls ""
+}
+
 HomebrewIsRefreshedOnlyAfterAFailure() {
   macos
   remove_package boost
