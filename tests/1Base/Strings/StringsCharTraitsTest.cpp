@@ -29,8 +29,7 @@ static_assert(std::is_base_of_v<CIntegerTraits<unsigned char>, std::char_traits<
 template <class TElement>
 class CCharTraitsTest : public testing::Test {
   protected:
-    using TTraits = CIntegerTraits<TElement>;
-    using TText = std::basic_string<TElement, TTraits>;
+    using TText = std::basic_string<TElement, CIntegerTraits<TElement>>;
     using TLimits = std::numeric_limits<TElement>;
 
     static TText textOf(std::initializer_list<int> values) {
