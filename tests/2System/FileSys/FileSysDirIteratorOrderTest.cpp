@@ -310,6 +310,22 @@ TEST_F(FileSysDirIteratorSizeTest, BeyondTheLongestPathEntriesAreWhatTheyAreElse
               (TNames{expected[0], expected[2]}));
 }
 
+// The walk goes from one to the other and back at each level.
+TEST_F(FileSysDirIteratorSizeTest, TwoDeepChainsAreNotMixedUp) {
+    constexpr int depth = 60;
+    TNames expected;
+    for (char const* const chain : {"a", "b"}) {
+        makeFolders(below(chain));
+        CDeepFolder const bottom(below(chain), std::string(150, *chain), depth);
+        bottom.makeFile(chain);
+        std::string path = chain;
+        for (int i = 0; i < depth; ++i)
+            path += "/" + std::string(150, *chain);
+        expected.push_back(path + "/" + chain);
+    }
+    EXPECT_EQ(walk(volume(), CDirIterator::eRecursive, CDirIterator::eFiles), expected);
+}
+
 // The system ends it where all is within one path. Behind that it would begin anew with each piece.
 TEST_F(FileSysDirIteratorSizeTest, ACycleOfLinksEndsWhateverTheLengthOfItsNames) {
     for (std::size_t const length : {1, 150, 250}) {
