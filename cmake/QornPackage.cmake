@@ -2,6 +2,9 @@
 # host that runs the extension needs no compiler, and who builds on the floors needs no Java.
 
 include_guard(GLOBAL)
+if(APPLE)
+  return()
+endif()
 
 set(CPACK_GENERATOR DEB)
 set(CPACK_VERBATIM_VARIABLES ON)
