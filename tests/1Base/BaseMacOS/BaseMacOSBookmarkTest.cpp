@@ -352,6 +352,13 @@ TEST_F(CBaseMacOSBookmarkTest, WithoutAnIdentityThePathsLeadAlone) {
     EXPECT_EQ(resolve(path("mark")), nothing);
 }
 
+TEST_F(CBaseMacOSBookmarkTest, WithoutARelativePathTheIdentityLeads) {
+    setEntry(path("mark"), "X-QORN-RelativePath", "");
+    EXPECT_EQ(resolve(path("mark")), path("file"));
+    rename(path("file"), path("renamed"));
+    EXPECT_EQ(resolve(path("mark")), path("renamed"));
+}
+
 // --- failures
 
 TEST_F(CBaseMacOSBookmarkTest, ADeletedTargetIsAFailure) {

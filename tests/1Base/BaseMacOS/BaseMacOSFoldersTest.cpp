@@ -260,6 +260,7 @@ TEST_F(CBaseMacOSFoldersTest, EachFormOfAnEntryIsRead) {
                            {"XDG_DESKTOP_DIR=\"", standard},
                            {"XDG_DESKTOP_DIR=\"/b", standard},
                            {"XDG_DESKTOP_DIR=\"/b\\\"", standard},
+                           {"XDG_DESKTOP_DIR=\"/b\\", standard},
                            {"XDG_DESKTOP_DIR=\"/b\"c", standard},
                            {"XDG_DESKTOP_DIR=\"b\"", standard},
                            {"XDG_DESKTOP_DIR=\"$HOMEb\"", standard},

@@ -4,7 +4,9 @@
 #include "support/FileRoot.h"
 
 #include <sys/stat.h>
+#include <unistd.h>
 
+#include <cerrno>
 #include <string>
 
 namespace {
@@ -97,6 +99,49 @@ TEST_F(CBaseMacOSIdentityTest, AMissingFolderIsSearchedFromTheNearestAbove) {
     EXPECT_EQ(findMovedFile(wanted, path("a/x/y/z/gone"), 1), path("a/target"));
     TestSupport::writeFile(path("file"));
     EXPECT_EQ(findMovedFile(wanted, path("file/x/gone"), enough), path("a/target"));
+}
+
+TEST_F(CBaseMacOSIdentityTest, TheFirstLinkThatIsFoundEndsTheSearch) {
+    CFileIdentity const wanted = made("a");
+    for (char const* const folder : {"1", "2", "3", "4"}) {
+        TestSupport::makeFolders(path(folder));
+        ASSERT_EQ(link(path("a").c_str(), path(std::string(folder) + "/link").c_str()), 0);
+    }
+    ASSERT_EQ(unlink(path("a").c_str()), 0);
+    // The folders, and the link in one of them.
+    std::string const found = findMovedFile(wanted, path("gone"), 5);
+    EXPECT_EQ(found.substr(found.rfind('/') + 1), "link");
+    ASSERT_TRUE(identityOf(found));
+    EXPECT_EQ(identityOf(found)->inode, wanted.inode);
+    EXPECT_EQ(findMovedFile(wanted, path("gone"), 4), "");
+}
+
+TEST_F(CBaseMacOSIdentityTest, WhereTheBirthTimeIsLostTheDeviceCounts) {
+    CFileIdentity wanted = made("target");
+    wanted.birth = 1;
+    system_.onStatx = [](std::string const&, struct statx& status) {
+        status.stx_mask &= ~unsigned{STATX_BTIME};
+    };
+    EXPECT_EQ(findMovedFile(wanted, path("gone"), 1), path("target"));
+    wanted.device ^= 1U;
+    EXPECT_EQ(findMovedFile(wanted, path("gone"), 1), "");
+}
+
+TEST_F(CBaseMacOSIdentityTest, WhatVanishesDuringTheSearchIsNotFound) {
+    CFileIdentity const wanted = made("target");
+    EXPECT_EQ(findMovedFile(wanted, path("gone"), 1), path("target"));
+    // The folder at the beginning, the folder when its turn comes, and the file.
+    for (unsigned nth = 1; nth <= 3; ++nth) {
+        system_.fail("statx", ENOENT, nth);
+        EXPECT_EQ(findMovedFile(wanted, path("gone"), 1), "") << nth;
+    }
+    EXPECT_EQ(findMovedFile(wanted, path("gone"), 1), path("target"));
+}
+
+TEST_F(CBaseMacOSIdentityTest, AboveTheRootNothingIsSearched) {
+    CFileIdentity const wanted = made("target");
+    system_.fail("opendir", EACCES);
+    EXPECT_EQ(findMovedFile(wanted, "/gone", enough), "");
 }
 
 } // namespace

@@ -41,7 +41,7 @@ TEST_F(CBaseMacOSMachineTest, WithoutAPrettyNameItIsTheHosts) {
     for (std::string const text :
          {"", "PRETTY_HOSTNAME=", "PRETTY_HOSTNAME=\"\"", "#PRETTY_HOSTNAME=a",
           "PRETTY_HOSTNAME=\"open", "PRETTY_HOSTNAME='open", "PRETTY_HOSTNAME=\"a\"b",
-          "PRETTY_HOSTNAMES=a", "HOSTNAME=a"})
+          "PRETTY_HOSTNAME='a'b", "PRETTY_HOSTNAMES=a", "HOSTNAME=a"})
         EXPECT_EQ(nameFor(text), L"host") << text;
 }
 

@@ -2,6 +2,7 @@
 
 #include "support/FileRoot.h"
 
+#include <filesystem>
 #include <random>
 #include <string>
 
@@ -43,6 +44,18 @@ TEST_F(CBaseMacOSPathTest, AnAbsolutePathKeepsItsLinks) {
     EXPECT_EQ(absolutePath(path("none/..")), "");
     EXPECT_EQ(absolutePath("//"), "/");
     EXPECT_EQ(absolutePath(""), "");
+}
+
+TEST_F(CBaseMacOSPathTest, ARelativePathNeedsAWorkingFolder) {
+    std::filesystem::path const before = std::filesystem::current_path();
+    TestSupport::makeFolders(path("gone"));
+    std::filesystem::current_path(path("gone"));
+    EXPECT_EQ(absolutePath("a"), path("gone/a"));
+    EXPECT_EQ(absolutePath("."), path("gone"));
+    std::filesystem::remove(path("gone"));
+    EXPECT_EQ(absolutePath("a"), "");
+    EXPECT_EQ(absolutePath("/a"), "/a");
+    std::filesystem::current_path(before);
 }
 
 TEST_F(CBaseMacOSPathTest, ARelativePathLeadsBackToItsEnd) {

@@ -1,5 +1,6 @@
 #include "1Base/BaseMacOS/BaseMacOSSystemCalls.h"
 
+#include <dirent.h>
 #include <fcntl.h>
 #include <pwd.h>
 #include <sys/stat.h>
@@ -40,9 +41,9 @@ void CSystemCalls::setUser(std::optional<CUserEntry> const& user, std::size_t ro
 
 bool CSystemCalls::takeFailure(std::string const& function) {
     auto const failure = failures_.find(function);
-    if (failure == failures_.end())
+    if (failure == failures_.end() || --failure->second.left != 0)
         return false;
-    errno = failure->second;
+    errno = failure->second.error;
     failures_.erase(failure);
     return true;
 }
@@ -65,6 +66,10 @@ bool isToFail(char const* function) {
 extern "C" {
 
 int __real_open(char const* path, int flags, mode_t mode);
+int __real_fstat(int descriptor, struct stat* status);
+ssize_t __real_read(int descriptor, void* data, size_t size);
+ssize_t __real_getrandom(void* data, size_t size, unsigned flags);
+DIR* __real_opendir(char const* path);
 ssize_t __real_write(int descriptor, void const* data, size_t size);
 int __real_close(int descriptor);
 int __real_rename(char const* from, char const* to);
@@ -89,6 +94,22 @@ int __wrap_open(char const* path, int flags, ...) {
     return __real_open(calls != nullptr ? calls->fileFor(path).c_str() : path, flags, mode);
 }
 
+int __wrap_fstat(int descriptor, struct stat* status) {
+    return isToFail("fstat") ? -1 : __real_fstat(descriptor, status);
+}
+
+ssize_t __wrap_read(int descriptor, void* data, size_t size) {
+    return isToFail("read") ? -1 : __real_read(descriptor, data, size);
+}
+
+ssize_t __wrap_getrandom(void* data, size_t size, unsigned flags) {
+    return isToFail("getrandom") ? -1 : __real_getrandom(data, size, flags);
+}
+
+DIR* __wrap_opendir(char const* path) {
+    return isToFail("opendir") ? nullptr : __real_opendir(path);
+}
+
 // A failing write is one of a full disk: half of the data is written first.
 ssize_t __wrap_write(int descriptor, void const* data, size_t size) {
     static bool wroteHalf = false;
@@ -98,6 +119,8 @@ ssize_t __wrap_write(int descriptor, void const* data, size_t size) {
         return -1;
     }
     if (isToFail("write")) {
+        if (errno == EINTR)
+            return -1;
         wroteHalf = true;
         return __real_write(descriptor, data, size / 2);
     }
@@ -139,6 +162,8 @@ int __wrap_gethostname(char* name, size_t size) {
 }
 
 int __wrap_statx(int folder, char const* path, int flags, unsigned mask, struct statx* status) {
+    if (isToFail("statx"))
+        return -1;
     int const result = __real_statx(folder, path, flags, mask, status);
     if (result == 0 && CSystemCalls::current() != nullptr && CSystemCalls::current()->onStatx)
         CSystemCalls::current()->onStatx(path, *status);

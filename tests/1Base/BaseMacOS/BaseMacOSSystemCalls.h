@@ -32,8 +32,11 @@ class CSystemCalls {
     CSystemCalls(CSystemCalls const&) = delete;
     CSystemCalls& operator=(CSystemCalls const&) = delete;
 
-    /// The next call of the function does nothing but fail.
-    void fail(std::string const& function, int error) { failures_[function] = error; }
+    /// The `nth` call of the function from now on does nothing but fail. A write fails in the
+    /// middle, as on a full disk, unless it is interrupted (EINTR).
+    void fail(std::string const& function, int error, unsigned nth = 1) {
+        failures_[function] = {error, nth};
+    }
 
     /// Opening `path` opens another file.
     void redirect(std::string const& path, std::string const& other) { files_[path] = other; }
@@ -63,7 +66,12 @@ class CSystemCalls {
     std::size_t userRoom() const { return userRoom_; }
 
   private:
-    std::map<std::string, int> failures_;
+    struct CFailure {
+        int error;
+        unsigned left; // the calls up to it
+    };
+
+    std::map<std::string, CFailure> failures_;
     std::map<std::string, std::string> files_;
     std::optional<std::string> hostName_;
     bool hasUsers_ = false;

@@ -44,7 +44,7 @@ TEST_F(CBaseMacOSUserTest, AnAmpersandIsTheLoginNameWithACapitalLetter) {
 
 TEST_F(CBaseMacOSUserTest, OnlyALetterOfASCIIGetsACapital) {
     CSystemCalls system;
-    for (std::string const login : {"_svc", "7up", "Ada",
+    for (std::string const login : {"_svc", "7up", "{x", "Ada",
                                     "\xC3\xA4"
                                     "da"}) {
         system.setUser(CUserEntry{login, "&", "/"});
