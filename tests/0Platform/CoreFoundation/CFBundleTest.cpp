@@ -5,8 +5,10 @@
 #include <atomic>
 #include <cstddef>
 #include <filesystem>
+#include <functional>
 #include <new>
 #include <thread>
+#include <utility>
 #include <vector>
 
 namespace fs = std::filesystem;
@@ -29,6 +31,9 @@ constexpr auto nothing = std::nullopt;
 // Which allocation from now on fails: the first is 1, and 0 is none.
 std::atomic<long> failingAllocation{0};
 std::atomic<long> openHandles{0};
+
+// Called once, between a library's coming and the platform's hearing of it.
+std::function<void()> onLoaded;
 
 bool mayAllocate() {
     return failingAllocation == 0 || --failingAllocation != 0;
@@ -68,6 +73,8 @@ void* __wrap_dlopen(char const* file, int mode) {
     EXPECT_EQ(mode, 1); // RTLD_LAZY
     void* const handle = __real_dlopen(file, mode);
     openHandles += handle != nullptr ? 1 : 0;
+    if (std::function<void()> const other = std::exchange(onLoaded, nullptr))
+        other();
     return handle;
 }
 
@@ -118,6 +125,23 @@ TEST_F(CFBundleTest, ARelativePathCountsFromTheFolderOfItsTime) {
     EXPECT_EQ(bundle.libraryName(), "First");
     EXPECT_TRUE(CBundle("Demo.bundle").isNull());
     fs::current_path("..");
+}
+
+TEST_F(CFBundleTest, WithoutAWorkingFolderARelativePathLeadsNowhere) {
+    fs::path const before = fs::current_path();
+    fs::create_directory("gone");
+    fs::current_path("gone");
+    fs::remove(before / "gone");
+    CPlatformString const relative(u"Demo.bundle");
+    EXPECT_EQ(CFURLCreateWithFileSystemPath(kCFAllocatorDefault, relative.get(),
+                                            kCFURLPOSIXPathStyle, true),
+              nullptr);
+    CPlatformString const absolute(u"/usr");
+    CFURLRef const url = CFURLCreateWithFileSystemPath(kCFAllocatorDefault, absolute.get(),
+                                                       kCFURLPOSIXPathStyle, true);
+    ASSERT_NE(url, nullptr);
+    CFRelease(url);
+    fs::current_path(before);
 }
 
 // --- the executable's place
@@ -337,6 +361,17 @@ TEST_F(CFBundleTest, ThreadsThatLoadAtOnceKeepOneHandle) {
         EXPECT_EQ(found, 4);
         EXPECT_EQ(openHandles, 1);
     }
+}
+
+TEST_F(CFBundleTest, OfTwoThatLoadTheFirstToEndCounts) {
+    copyLibrary("First", demoExecutable);
+    CBundle const bundle("Demo.bundle");
+    void* inner = nullptr;
+    onLoaded = [&] { inner = bundle.symbol("libraryName"); };
+    EXPECT_TRUE(bundle.load());
+    EXPECT_NE(inner, nullptr);
+    EXPECT_EQ(bundle.symbol("libraryName"), inner);
+    EXPECT_EQ(openHandles, 1);
 }
 
 // --- without memory

@@ -8,8 +8,10 @@
 #include <unicode/gregocal.h>
 #include <unicode/simpletz.h>
 
+#include <cerrno>
 #include <cmath>
 #include <cstdio>
+#include <cstdlib>
 #include <ctime>
 #include <memory>
 #include <random>
@@ -24,6 +26,24 @@ constexpr double hour = 3600000;
 constexpr double day = 24 * hour;
 constexpr double year2008 = 1199145600000;
 constexpr double year2020 = 1577836800000;
+
+bool isSystemsZoneMissing = false;
+
+} // namespace
+
+extern "C" {
+char* __real_realpath(char const* path, char* resolved);
+char* __wrap_realpath(char const* path, char* resolved);
+
+char* __wrap_realpath(char const* path, char* resolved) {
+    if (!isSystemsZoneMissing)
+        return __real_realpath(path, resolved);
+    errno = ENOENT;
+    return nullptr;
+}
+}
+
+namespace {
 
 int32_t offsetOf(icu::TimeZone const& zone, double instant, bool isLocal = false) {
     int32_t raw = 0;
@@ -48,6 +68,14 @@ class CFDefaultZoneTest : public CDateTest {
         EXPECT_NE(zone, nullptr);
         return zone;
     }
+
+    static void expectSystemsZone(icu::TimeZone const& zone) {
+        for (double instant = year2008; instant < year2020; instant += 30 * day) {
+            auto const seconds = static_cast<std::time_t>(instant / 1000);
+            std::tm const local = *std::localtime(&seconds);
+            EXPECT_EQ(offsetOf(zone, instant), local.tm_gmtoff * 1000) << instant;
+        }
+    }
 };
 
 TEST_F(CFDefaultZoneTest, AZonesNameIsIcusZone) {
@@ -65,12 +93,15 @@ TEST_F(CFDefaultZoneTest, AnEmptyVariableIsUTC) {
 }
 
 TEST_F(CFDefaultZoneTest, WithoutTheVariableItIsTheSystemsZone) {
+    expectSystemsZone(*zoneUnder(std::nullopt));
+}
+
+// It is UTC as a rule. Where the C library has another one from elsewhere, that counts.
+TEST_F(CFDefaultZoneTest, ASystemThatNamesNoZoneHasTheCLibrarys) {
+    isSystemsZoneMissing = true;
     CFPlatform::ZoneOwner const zone = zoneUnder(std::nullopt);
-    for (double instant = year2008; instant < year2020; instant += 30 * day) {
-        auto const seconds = static_cast<std::time_t>(instant / 1000);
-        std::tm const local = *std::localtime(&seconds);
-        EXPECT_EQ(offsetOf(*zone, instant), local.tm_gmtoff * 1000) << instant;
-    }
+    isSystemsZoneMissing = false;
+    expectSystemsZone(*zone);
 }
 
 TEST_F(CFDefaultZoneTest, WhatOnlyTheCLibraryKnowsIsAskedOfIt) {
@@ -184,6 +215,17 @@ TEST_F(CFLocaltimeZoneTest, ACloneIsEqual) {
     zone.setRawOffset(0);
     EXPECT_EQ(zone.getRawOffset(), 0);
     EXPECT_EQ(clone->getRawOffset(), 5.75 * hour);
+}
+
+TEST_F(CFLocaltimeZoneTest, AFailureBeforeTheCallStays) {
+    beginZone("XYZ-5:45");
+    int32_t raw = 1;
+    int32_t saving = 2;
+    UErrorCode status = U_ILLEGAL_ARGUMENT_ERROR;
+    LocaltimeZone().getOffset(year2008, false, raw, saving, status);
+    EXPECT_EQ(status, U_ILLEGAL_ARGUMENT_ERROR);
+    EXPECT_EQ(raw, 1);
+    EXPECT_EQ(saving, 2);
 }
 
 TEST_F(CFLocaltimeZoneTest, AnInstantBeyondTheCLibrarysYearsHasNoOffset) {

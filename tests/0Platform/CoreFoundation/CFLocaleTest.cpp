@@ -86,9 +86,15 @@ TEST_F(CFLocaleTest, CodesetAndModifierAreLeftOut) {
         EXPECT_EQ(upperIUnder(name), others) << name;
 }
 
+TEST_F(CFLocaleTest, ATerritoryMayBeANumber) {
+    EXPECT_EQ(upperIUnder("tr_792"), turkish);
+    EXPECT_EQ(upperIUnder("az_Latn_031"), turkish);
+}
+
 TEST_F(CFLocaleTest, WhatIsNoLocalesNameIsTheRootLocale) {
-    for (char const* const name : {"C", "C.UTF-8", "POSIX", "turkish", "t", "_TR", "tr-TR", "tr TR",
-                                   "/tr_TR", "tr_T\xC3\x9C", "1tr", "xx_YY", ".UTF-8", "@tr"})
+    for (char const* const name :
+         {"C", "C.UTF-8", "POSIX", "turkish", "t", "_TR", "tr-TR", "tr TR", "/tr_TR",
+          "tr_T\xC3\x9C", "tr_T{", "1tr", "xx_YY", ".UTF-8", "@tr"})
         EXPECT_EQ(upperIUnder(name), others) << name;
 }
 

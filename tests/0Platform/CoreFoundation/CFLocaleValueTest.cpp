@@ -93,6 +93,12 @@ TEST_F(CFLocaleValueTest, TheLocaleKeepsWhatItWas) {
     CFRelease(locale);
 }
 
+TEST_F(CFLocaleValueTest, TheRootLocaleIsMetricWhateverTheEnvironmentIs) {
+    setenv("LC_ALL", "en_US", 1);
+    EXPECT_FALSE(isMetric());
+    EXPECT_EQ(CFLocaleGetValue(nullptr, kCFLocaleUsesMetricSystem), kCFBooleanTrue);
+}
+
 TEST_F(CFLocaleValueTest, AnotherKeyHasNoValue) {
     EXPECT_EQ(valueOf(kCFGregorianCalendar), nullptr);
 }

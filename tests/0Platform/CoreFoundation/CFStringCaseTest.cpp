@@ -158,6 +158,10 @@ TEST_F(CFStringCaseTest, OtherGreekAccentsAreMappedAsElsewhere) {
     EXPECT_EQ(upper("el_GR", u"\u03B1\u0301\u03B9"), u"\u0391\u0301\u0399");
 }
 
+TEST_F(CFStringCaseTest, LettersOfOtherScriptsKeepTheirAccentsInGreek) {
+    EXPECT_EQ(upper("el_GR", u"\u1E3F\u03AC\u0453\u03AC"), u"\u1E3E\u0391\u0403\u0391");
+}
+
 TEST_F(CFStringCaseTest, DutchMapsLikeTheRootLocale) {
     EXPECT_EQ(upper("nl_NL", u"ijsland \u0133"), u"IJSLAND \u0132");
     EXPECT_EQ(lower("nl_NL", u"IJsland \u0132"), u"ijsland \u0133");

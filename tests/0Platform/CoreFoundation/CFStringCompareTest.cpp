@@ -174,6 +174,14 @@ TEST_F(CFStringCompareTest, FoldingAgainstAClustersMiddleCountsAsEqual) {
     EXPECT_EQ(answersOf(u"f\uFB01", u"\uFB01"), (TAnswers{1, 1, 1, 1}));
 }
 
+// A folded letter has its mark as one value, which is two units in the other text.
+TEST_F(CFStringCompareTest, AMarkBeyondTheFirstPlaneIsComparedWhole) {
+    std::u16string const upper = u"\u0531\U0001D165";
+    std::u16string const lower = u"\u0561\U0001D165";
+    EXPECT_EQ(answersOf(upper, lower), (TAnswers{0, 0, 0, 0}));
+    EXPECT_EQ(compared(upper + u"a", lower + u"b", naturally), -1);
+}
+
 TEST_F(CFStringCompareTest, MarksAreSkippedOnlyWithinTheFirstText) {
     EXPECT_EQ(answersOf(u"\u00DF\u0301", u"s\u0301s"), (TAnswers{-1, 1, -1, 0}));
 }

@@ -78,6 +78,14 @@ TEST_F(CFStringNormalizeTest, ASyllableOfTheTextTakesNoFinalLetter) {
               u"\u1112\u1161\u11AB\u1100\u1161\u11A8e\u0301\u1100\u1161\u11A8");
 }
 
+// One that has a final letter already, and a letter that is no syllable.
+TEST_F(CFStringNormalizeTest, AFinalLetterBehindOtherLettersStays) {
+    std::u16string const text = u"\uAC01\u11A8e\u0301\uFF21\u11A8";
+    EXPECT_EQ(normalized(text, kCFStringNormalizationFormC), u"\uAC01\u11A8\u00E9\uFF21\u11A8");
+    EXPECT_EQ(normalized(text, kCFStringNormalizationFormD),
+              u"\u1100\u1161\u11A8\u11A8e\u0301\uFF21\u11A8");
+}
+
 TEST_F(CFStringNormalizeTest, CharactersBeyondUnicode13StayWhateverStandsBesideThem) {
     EXPECT_EQ(normalized(u"e\u0301\uA7F2e\u0301", kCFStringNormalizationFormKC),
               u"\u00E9\uA7F2\u00E9");

@@ -39,7 +39,7 @@ TEST_F(CFStringSystemEncodingTest, ACodesetThatIsServedIsTheEncoding) {
 
 TEST_F(CFStringSystemEncodingTest, ACodesetMayBeSpelledInManyWays) {
     for (char const* const locale : {"de_DE.iso88591", "de_DE.ISO8859-1", "de.iso-8859-1",
-                                     "de_DE.ISO_8859-1@euro", "x.LATIN1"})
+                                     "de_DE.ISO_8859-1@euro", "de_DE.{iso}8859~1", "x.LATIN1"})
         EXPECT_EQ(encodingOf(locale), kCFStringEncodingISOLatin1) << locale;
 }
 

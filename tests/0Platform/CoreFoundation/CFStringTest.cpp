@@ -15,6 +15,7 @@ using TestSupport::CPlatformString;
 namespace {
 
 long allocations = 0;
+bool isMemoryShort = false;
 
 } // namespace
 
@@ -27,7 +28,7 @@ void* __real__Znam(std::size_t bytes);
 
 void* __wrap_malloc(std::size_t bytes) {
     ++allocations;
-    return __real_malloc(bytes);
+    return isMemoryShort ? nullptr : __real_malloc(bytes);
 }
 
 void* __wrap_calloc(std::size_t count, std::size_t bytes) {
@@ -260,6 +261,23 @@ TEST_F(CFStringTest, ReadingAStringAllocatesNothing) {
 TEST_F(CFStringTest, AMalformedTextLeavesNothingBehind) {
     long const liveBefore = TestSupport::liveObjects();
     EXPECT_EQ(CPlatformString("\xFF", kCFStringEncodingUTF8).get(), nullptr);
+    EXPECT_EQ(TestSupport::liveObjects(), liveBefore);
+}
+
+TEST_F(CFStringTest, WithoutMemoryForAStringTheAnswerIsNull) {
+    CPlatformString const whole(u"text");
+    long const liveBefore = TestSupport::liveObjects();
+    UInt8 const bytes[] = {4, 't', 'e', 'x', 't'};
+    UniChar const units[] = {'t', 'e', 'x', 't'};
+    isMemoryShort = true;
+    CFTypeRef const strings[] = {
+        CFStringCreateWithBytes(kCFAllocatorDefault, bytes + 1, 4, kCFStringEncodingUTF8, false),
+        CFStringCreateWithCharacters(kCFAllocatorDefault, units, 4),
+        CFStringCreateWithPascalString(kCFAllocatorDefault, bytes, kCFStringEncodingUTF8),
+        CFStringCreateMutableCopy(kCFAllocatorDefault, 0, whole.get())};
+    isMemoryShort = false;
+    for (CFTypeRef const string : strings)
+        EXPECT_EQ(string, nullptr);
     EXPECT_EQ(TestSupport::liveObjects(), liveBefore);
 }
 
