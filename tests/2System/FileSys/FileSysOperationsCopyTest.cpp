@@ -242,6 +242,16 @@ TEST_F(CCopyFileTest, FailuresOfTheSystemAreTheReason) {
     EXPECT_EQ(readFile(path("from")), "new text");
 }
 
+// The kernel's own files have a file system of their own.
+TEST_F(CCopyFileTest, AFileOfAnotherDeviceReplacesWhatIsThere) {
+    std::string const kernels = "/proc/sys/kernel/ostype";
+    if (!TestSupport::pathExists(kernels))
+        GTEST_SKIP() << "there is no " << kernels;
+    writeFile(path("to"), "old");
+    FileSys::copyFile(kernels, path("to"), true);
+    EXPECT_EQ(readFile(path("to")), readFile(kernels));
+}
+
 // The kernel copies where it can; what it can't is read and written.
 TEST_F(CCopyFileTest, TheContentArrivesOnEveryRoad) {
     std::string content(300000, 'c');

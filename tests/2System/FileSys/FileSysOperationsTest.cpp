@@ -14,6 +14,7 @@
 #include <unistd.h>
 
 #include <cerrno>
+#include <cstdio>
 #include <ios>
 #include <string>
 #include <vector>
@@ -251,6 +252,21 @@ TEST_F(CDeleteFileTest, WhatComesBackAtOnceFailsWithoutAReason) {
                   Error::msgCouldNot,
                   couldNot(L"delete", L"file or folder", wide(path("folder")), L""),
                   {"doDeleteFile", "deleteFile"});
+}
+
+TEST_F(CDeleteFileTest, AFailureCountsThoughTheFileIsGone) {
+    writeFile(path("file"));
+    CSystemCalls calls;
+    calls.fail("unlinkat", EIO);
+    calls.observe([&](std::string const& function, std::string const& name) {
+        if (function == "unlinkat")
+            std::remove(name.c_str());
+    });
+    expectFailure(failureOf([&] { FileSys::deleteFile(path("file"), false); }), "FileSpec",
+                  Error::msgCouldNot,
+                  couldNot(L"delete", L"file or folder", wide(path("file")), errorText(EIO)),
+                  {"doDeleteFile", "deleteFile"});
+    EXPECT_FALSE(pathExists(path("file")));
 }
 
 TEST_F(CDeleteFileTest, APathThatCannotBeAskedAboutBehindItFailsByThat) {
