@@ -84,4 +84,17 @@ TEST(CFConverterTableTest, CodesOfMoreThanTwoBytesAreLeftOut) {
     EXPECT_EQ(codes.count(0xD800), 0U);
 }
 
+// In the Hong Kong form of Big5, A440 is U+4E00 and 90A1 is U+20D31, which has two units.
+TEST(CFConverterTableTest, ACodeForSeveralUnitsIsUnassigned) {
+    std::unique_ptr<ConverterTable const> const table = ConverterTable::read("Big5-HKSCS");
+    ASSERT_NE(table, nullptr);
+    DecodeTable const decoding = table->decoding();
+    auto const cellOf = [&](unsigned lead, unsigned trail) {
+        DecodeRow const row = decoding.rows[lead - 0x80];
+        return decoding.cells[row.offset + (trail - row.first)];
+    };
+    EXPECT_EQ(cellOf(0xA4, 0x40), 0x4E00);
+    EXPECT_EQ(cellOf(0x90, 0xA1), cellUnassigned);
+}
+
 } // namespace
