@@ -101,9 +101,10 @@ class CLogSingleton {
     static void dolog(Detail::TLogTargetList const& list, char const* file, unsigned int line,
                       char const* func, char const* date, char const* time, TChar const* text,
                       Strings::CParameterList<wchar_t>&& params) {
-        write_(list, file, line, func, date, time, TemplMeta::getTagName<TTag>(),
-               TemplMeta::getTagName<TTarget>(), TemplMeta::getTagName<TSeverity>(), text,
-               std::move(params));
+        if (!list.empty())
+            write_(list, file, line, func, date, time, TemplMeta::getTagName<TTag>(),
+                   TemplMeta::getTagName<TTarget>(), TemplMeta::getTagName<TSeverity>(), text,
+                   std::move(params));
     }
 
     // The parameters are used up.

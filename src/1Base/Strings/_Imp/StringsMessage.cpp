@@ -230,6 +230,8 @@ template <class TChar, class TParameterList>
 typename CMessage<TChar, TParameterList>::TPosition
 CMessage<TChar, TParameterList>::findMate_(TText const& text, TChar const& open, TChar const& close,
                                            TPosition position) {
+    if (text[position] != open)
+        return TText::npos;
     // A depth rather than a recursion: a text of nothing but open characters must not end the
     // stack. The close character is asked for first: the two may be the same.
     std::size_t depth = 1;
@@ -246,6 +248,8 @@ CMessage<TChar, TParameterList>::findMate_(TText const& text, TChar const& open,
 
 template <class TChar, class TParameterList>
 void CMessage<TChar, TParameterList>::addLeftoverPars_(TText& text, TMap& remaining) {
+    if (remaining.empty())
+        return;
     TText suffix = L" (";
     bool first = true;
     for (auto const& [name, value] : remaining) {

@@ -49,11 +49,12 @@ Strings::CParameterList<wchar_t> libraryNotFound(FileSys::CFileSpec const& spec)
     return notFound("dynamic link library", spec.getFullName<std::string>(false) + ' ');
 }
 
-// Of a library that is loaded: the C library takes a null handle for the whole process.
 void* findSymbol(TLibraryRef const& library, Strings::string const& name) {
     if (library.first != nullptr)
         return CFBundleGetFunctionPointerForName(library.first, MacOS::CTempCFString(name).get());
-    return ::dlsym(library.second, Encoding::convert<std::string>(name).c_str());
+    if (library.second != nullptr)
+        return ::dlsym(library.second, Encoding::convert<std::string>(name).c_str());
+    return nullptr;
 }
 
 } // namespace
