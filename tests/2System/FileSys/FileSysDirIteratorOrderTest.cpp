@@ -328,7 +328,7 @@ TEST_F(FileSysDirIteratorSizeTest, TwoDeepChainsAreNotMixedUp) {
 
 // The system ends it where all is within one path. Behind that it would begin anew with each piece.
 TEST_F(FileSysDirIteratorSizeTest, ACycleOfLinksEndsWhateverTheLengthOfItsNames) {
-    for (std::size_t const length : {1, 150, 250}) {
+    for (std::size_t const length : {1U, 150U, 250U}) {
         std::string const name(length, 'n');
         makeFolders(below(name));
         makeLink("..", below(name + "/up"));
