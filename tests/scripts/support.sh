@@ -20,9 +20,11 @@ export GIT_CONFIG_GLOBAL=/dev/null GIT_CONFIG_NOSYSTEM=1
 export GIT_AUTHOR_NAME=Ada GIT_AUTHOR_EMAIL=ada@example.org
 export GIT_COMMITTER_NAME=Ada GIT_COMMITTER_EMAIL=ada@example.org
 
+# What is quoted is indented, so that no line of it is taken for one of this test.
 fail() {
   printf 'FAILED: %s\n' "$*" >&2
-  printf 'it said: %s\n' "${output:-nothing}" >&2
+  output=${output:-nothing}
+  printf 'it said: %s\n' "${output//$'\n'/$'\n  '}" >&2
   exit 1
 }
 
