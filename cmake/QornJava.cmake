@@ -1,4 +1,4 @@
-# qorn_add_java(<name> [JAR <file>] SOURCES ...)
+# qorn_add_java(<name> [CLASSPATH <jar>] [JAR <file>] SOURCES ...)
 #
 # The target <name> compiles Java sources into the folder java/<name> of the build, which it owns.
 # JAR packs them into java/<file>, whose manifest bears the project's version.
@@ -14,7 +14,10 @@ else()
 endif()
 
 function(qorn_add_java name)
-  cmake_parse_arguments(PARSE_ARGV 1 arg "" "JAR" "SOURCES")
+  cmake_parse_arguments(PARSE_ARGV 1 arg "" "CLASSPATH;JAR" "SOURCES")
+  if(arg_CLASSPATH)
+    set(class_path -cp ${arg_CLASSPATH})
+  endif()
   list(TRANSFORM arg_SOURCES PREPEND ${CMAKE_CURRENT_SOURCE_DIR}/)
   set(classes ${PROJECT_BINARY_DIR}/java/${name})
   set(stamp ${CMAKE_CURRENT_BINARY_DIR}/${name}.stamp)
@@ -22,7 +25,7 @@ function(qorn_add_java name)
     COMMAND ${CMAKE_COMMAND} -E rm -rf ${classes} ${stamp}
     COMMAND ${CMAKE_COMMAND} -E make_directory ${classes}
     COMMAND ${CMAKE_COMMAND} -E env ${QORN_JAVA_LOCALE} ${Java_JAVAC_EXECUTABLE}
-            --release 11 -encoding UTF-8 -Xlint:all -Werror -d ${classes} ${arg_SOURCES}
+            --release 11 -encoding UTF-8 -Xlint:all -Werror ${class_path} -d ${classes} ${arg_SOURCES}
     COMMAND ${CMAKE_COMMAND} -E touch ${stamp}
     DEPENDS ${arg_SOURCES}
     COMMENT "Compiling Java ${name}"

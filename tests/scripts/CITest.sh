@@ -13,6 +13,7 @@ project_with_commands() {
   command_that scripts/check <<<'echo checked'
   command_that scripts/docs <<<'echo documented'
   command_that scripts/reproduce <<<'echo reproduced'
+  command_that scripts/install-office <<<'echo "skipped: office: no such package"'
   command_that scripts/check-headers <<<'echo "headers with $CXX"'
   command_that scripts/analyze <<<'echo analyzed'
 }
@@ -31,6 +32,7 @@ AllStepsPass() {
   expect_said "headers with clang++"
   expect_said documented
   expect_not_said "failed step"
+  [ "$(grep -c "^skipped: office: no such package" <<<"$output")" -eq 2 ] || fail "no reason in the summary"
   expect_last_line "15 passed, 0 failed, 3 skipped"
 }
 
