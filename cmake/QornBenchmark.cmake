@@ -5,7 +5,10 @@
 # with a message; where it is there, the sources see QORN_HAVE_<PEER> (QORN_HAVE_QT and so on).
 
 include_guard(GLOBAL)
-find_package(benchmark REQUIRED)
+find_package(benchmark QUIET)
+if(NOT benchmark_FOUND)
+  message(FATAL_ERROR "The benchmarks need Google Benchmark (Debian: libbenchmark-dev)")
+endif()
 find_package(PkgConfig QUIET)
 
 # Makes qorn_peer_<name>, which brings headers, libraries and the definition, or nothing at all.

@@ -14,6 +14,11 @@ if(QORN_CCACHE AND PROJECT_IS_TOP_LEVEL AND NOT CMAKE_CXX_COMPILER_LAUNCHER)
   set(CMAKE_CXX_COMPILER_LAUNCHER ${QORN_CCACHE})
 endif()
 
+# Nothing of the floors is exported, so that none could be linked against as a shared library.
+if(BUILD_SHARED_LIBS AND PROJECT_IS_TOP_LEVEL)
+  message(NOTICE "BUILD_SHARED_LIBS changes nothing: the foundation's libraries are static")
+endif()
+
 # What every target of this project is compiled and linked with, and nobody else's.
 add_library(qorn_build_options INTERFACE)
 target_compile_features(qorn_build_options INTERFACE cxx_std_17)
