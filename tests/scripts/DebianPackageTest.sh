@@ -9,8 +9,9 @@ source "$(dirname -- "${BASH_SOURCE[0]}")/package.sh"
 clone="$work/clone, of Größe 東京"
 packages=$clone/build/package
 
+# In the "C" locale CPack finds no file in a path that is not ASCII.
 make_packages() {
-  expect_success "$CPACK" --config "$BUILD/CPackConfig.cmake" -B "$packages"
+  expect_success env LC_ALL=C.UTF-8 "$CPACK" --config "$BUILD/CPackConfig.cmake" -B "$packages"
 }
 
 # package_file <name>: prints where the package lies.

@@ -207,7 +207,7 @@ TheStandInForJavaIsNoJava() {
   rm -- "$mac/opt/homebrew/opt/openjdk@17"
   # Found only where the folder above the stand-in is taken for a Java's.
   add_to_mac /usr/lib/server/libjvm.dylib </dev/null
-  expect_failure 1 "JAVA_INCLUDE_PATH2 JVM)" configure "$root"
+  expect_failure 1 "The Java bridge needs a JDK 11 or newer" configure "$root"
 }
 
 AnotherJavaCanBeChosen() {
