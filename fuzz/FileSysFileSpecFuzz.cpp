@@ -2,13 +2,14 @@
 //
 // An input is two texts with a byte FF between them, which stands in no UTF-8.
 
+#include "FuzzTexts.h"
+
 #include "1Base/Error/Error.h"
 #include "2System/FileSys/FileSysFileSpec.h"
 
 #include <algorithm>
 #include <cstddef>
 #include <cstdint>
-#include <cstdlib>
 #include <string>
 
 extern "C" int LLVMFuzzerTestOneInput(std::uint8_t const* data, std::size_t size);
@@ -16,11 +17,7 @@ extern "C" int LLVMFuzzerTestOneInput(std::uint8_t const* data, std::size_t size
 namespace {
 
 using FileSys::CFileSpec;
-
-void require(bool condition) {
-    if (!condition)
-        std::abort();
-}
+using FuzzTexts::require;
 
 Strings::string textOf(CFileSpec const& spec) {
     return spec.getFullName(false);
@@ -123,20 +120,11 @@ void check(std::string const& first, std::string const& second) {
     checkAcrobat(first, left);
 }
 
-// The conversion refuses it and keeps its platform string, as with every failed read, which would
-// show as a leak here.
-bool isMarkAlone(std::string const& text) {
-    return text == "\xEF\xBB\xBF";
-}
-
 } // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(std::uint8_t const* data, std::size_t size) {
-    std::string const input(reinterpret_cast<char const*>(data), size);
-    std::size_t const end = std::min(input.find('\xFF'), size);
-    std::string const first = input.substr(0, end);
-    std::string const second = input.substr(std::min(end + 1, size));
-    if (isMarkAlone(first) || isMarkAlone(second))
+    auto const [first, second] = FuzzTexts::twoTexts(data, size);
+    if (FuzzTexts::isMarkAlone(first) || FuzzTexts::isMarkAlone(second))
         return 0;
     try {
         Encoding::convert<Strings::string>(first);

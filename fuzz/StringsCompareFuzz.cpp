@@ -5,6 +5,8 @@
 // An input is two texts with a byte FF between them, which stands in no UTF-8. They are compared as
 // UTF-8, and once more with their bytes taken for UTF-16, where surrogates may lack their partner.
 
+#include "FuzzTexts.h"
+
 #include "1Base/Encoding/EncodingConverter.h"
 #include "1Base/Strings/StringsCompare.h"
 
@@ -12,19 +14,14 @@
 
 #include <CoreFoundation/CoreFoundation.h>
 
-#include <algorithm>
 #include <cstddef>
 #include <cstdint>
-#include <cstdlib>
 #include <cstring>
 #include <string>
 
 namespace {
 
-void require(bool condition) {
-    if (!condition)
-        std::abort();
-}
+using FuzzTexts::require;
 
 CFStringRef createString(std::u16string const& units) {
     return CFStringCreateWithCharacters(kCFAllocatorDefault,
@@ -73,12 +70,6 @@ bool isWellFormed(std::string const& text) {
     return true;
 }
 
-// Holds nothing to convert. The conversion refuses it and keeps its platform string, as with every
-// failed read, which would show as a leak here.
-bool isMarkAlone(std::string const& text) {
-    return text == "\xEF\xBB\xBF";
-}
-
 void checkTexts(std::string const& a, std::string const& b) {
     Strings::string const wideA = Encoding::convert<Strings::string>(a);
     Strings::string const wideB = Encoding::convert<Strings::string>(b);
@@ -106,12 +97,9 @@ void checkRefused(std::string const& a, std::string const& b) {
 } // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(std::uint8_t const* data, std::size_t size) {
-    std::string const input(reinterpret_cast<char const*>(data), size);
-    std::size_t const end = std::min(input.find('\xFF'), size);
-    std::string const first = input.substr(0, end);
-    std::string const second = input.substr(std::min(end + 1, size));
+    auto const [first, second] = FuzzTexts::twoTexts(data, size);
     checkUnits(unitsOfBytes(first), unitsOfBytes(second));
-    if (isMarkAlone(first) || isMarkAlone(second))
+    if (FuzzTexts::isMarkAlone(first) || FuzzTexts::isMarkAlone(second))
         return 0;
     if (isWellFormed(first) && isWellFormed(second))
         checkTexts(first, second);
