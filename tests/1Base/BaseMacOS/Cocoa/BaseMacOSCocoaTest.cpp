@@ -29,7 +29,9 @@ passwd const& user() {
     return *getpwuid(geteuid());
 }
 
+// A byte order mark at the beginning is no part of a text to GNUstep.
 TEST_F(BaseMacOSCocoaTest, BothSidesEscapeTheSame) {
+    constexpr unsigned mark = 0xFEFF;
     std::mt19937 random(20210305);
     std::uniform_int_distribution<int> length(0, 40);
     std::uniform_int_distribution<unsigned> kind(0, 3);
@@ -39,7 +41,8 @@ TEST_F(BaseMacOSCocoaTest, BothSidesEscapeTheSame) {
         for (int rest = length(random); rest > 0; --rest) {
             std::uniform_int_distribution<unsigned> code(1, limits[kind(random)]);
             auto const character = code(random);
-            if (character < 0xD800 || character > 0xDFFF)
+            bool const isRead = character != mark || !text.empty();
+            if (isRead && (character < 0xD800 || character > 0xDFFF))
                 text += static_cast<wchar_t>(character);
         }
         auto const source = Encoding::convert<std::string>(text);
