@@ -81,6 +81,7 @@ TYPED_TEST(CCharTraitsTest, NoElementIsTheEnd) {
         ASSERT_EQ(TTraits::not_eof(number), number) << value;
         ASSERT_EQ(TTraits::to_char_type(number), element) << value;
     }
+    EXPECT_NE(TTraits::not_eof(TTraits::eof()), TTraits::eof());
 }
 
 TYPED_TEST(CCharTraitsTest, ElementsCompareByTheirValues) {

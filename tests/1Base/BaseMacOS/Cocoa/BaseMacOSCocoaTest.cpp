@@ -60,6 +60,10 @@ TEST_F(BaseMacOSCocoaTest, EveryCharacterOfASCIIIsEscapedTheSame) {
     EXPECT_EQ(Cocoa::addingPercentEscapes("\xC3\xA4"), "%C3%A4");
 }
 
+TEST_F(BaseMacOSCocoaTest, WhatIsNotUTF8GivesNothing) {
+    EXPECT_EQ(Cocoa::addingPercentEscapes("\xFF"), "");
+}
+
 TEST_F(BaseMacOSCocoaTest, ATextEndsAtAZero) {
     EXPECT_EQ(Cocoa::addingPercentEscapes(std::string("a\0b", 3)), "a");
 }
